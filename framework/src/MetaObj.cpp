@@ -1,0 +1,135 @@
+#include "framework/MetaObj.h"
+
+#include <limits>
+#include <stdexcept>
+
+namespace MetaObj {
+
+const char* MetaTypeName(int type) {
+    switch (type) {
+    case META_BOOL: return "bool";
+    case META_INT: return "int";
+    case META_STRING: return "string";
+    case META_STRUCT: return "struct";
+    case META_LIST: return "list";
+    }
+    return "unknown";
+}
+
+MetaObject::~MetaObject() = default;
+
+boost::shared_ptr<MetaString> MetaString::New() { return boost::shared_ptr<MetaString>(new MetaString()); }
+
+boost::shared_ptr<MetaString> MetaString::New(const std::string& value) {
+    boost::shared_ptr<MetaString> s(new MetaString());
+    s->value_ = value;
+    s->hasValue_ = true;
+    return s;
+}
+
+boost::shared_ptr<MetaInt> MetaInt::New() { return boost::shared_ptr<MetaInt>(new MetaInt()); }
+
+boost::shared_ptr<MetaInt> MetaInt::New(std::int64_t value) {
+    boost::shared_ptr<MetaInt> i(new MetaInt());
+    i->bits_ = static_cast<std::uint64_t>(value);
+    i->hasValue_ = true;
+    return i;
+}
+
+boost::shared_ptr<MetaInt> MetaInt::NewUnsigned(std::uint64_t value) {
+    boost::shared_ptr<MetaInt> i(new MetaInt());
+    i->bits_ = value;
+    i->isUnsigned_ = value > static_cast<std::uint64_t>(std::numeric_limits<std::int64_t>::max());
+    i->hasValue_ = true;
+    return i;
+}
+
+std::string MetaInt::ToString() const {
+    return isUnsigned_ ? std::to_string(bits_) : std::to_string(static_cast<std::int64_t>(bits_));
+}
+
+boost::shared_ptr<MetaBool> MetaBool::New() { return boost::shared_ptr<MetaBool>(new MetaBool()); }
+
+boost::shared_ptr<MetaBool> MetaBool::New(bool value) {
+    boost::shared_ptr<MetaBool> b(new MetaBool());
+    b->value_ = value;
+    b->hasValue_ = true;
+    return b;
+}
+
+boost::shared_ptr<MetaStruct> MetaStruct::New(const std::string& typeName) {
+    return boost::shared_ptr<MetaStruct>(new MetaStruct(typeName));
+}
+
+void MetaStruct::SetField(const std::string& name, const MetaObjectPtr& value) {
+    if (!value) {
+        throw std::invalid_argument("MetaStruct::SetField: null value for field '" + name + "'");
+    }
+    for (auto& field : fields_) {
+        if (field.first == name) {
+            field.second = value;
+            return;
+        }
+    }
+    fields_.emplace_back(name, value);
+}
+
+void MetaStruct::SetField(const std::string& name, const std::string& value) {
+    SetField(name, MetaString::New(value));
+}
+void MetaStruct::SetField(const std::string& name, const char* value) {
+    SetField(name, MetaString::New(value ? value : ""));
+}
+void MetaStruct::SetField(const std::string& name, bool value) { SetField(name, MetaBool::New(value)); }
+void MetaStruct::SetField(const std::string& name, int value) { SetField(name, MetaInt::New(value)); }
+void MetaStruct::SetField(const std::string& name, long value) { SetField(name, MetaInt::New(value)); }
+void MetaStruct::SetField(const std::string& name, long long value) { SetField(name, MetaInt::New(value)); }
+void MetaStruct::SetField(const std::string& name, unsigned int value) {
+    SetField(name, MetaInt::NewUnsigned(value));
+}
+void MetaStruct::SetField(const std::string& name, unsigned long value) {
+    SetField(name, MetaInt::NewUnsigned(value));
+}
+void MetaStruct::SetField(const std::string& name, unsigned long long value) {
+    SetField(name, MetaInt::NewUnsigned(value));
+}
+void MetaStruct::SetField(const std::string& name, const std::vector<std::string>& values) {
+    boost::shared_ptr<MetaList> list = MetaList::New(META_STRING);
+    for (const auto& v : values) list->Append(v);
+    SetField(name, list);
+}
+
+MetaObjectPtr MetaStruct::GetField(const std::string& name) const {
+    for (const auto& field : fields_) {
+        if (field.first == name) return field.second;
+    }
+    return MetaObjectPtr();
+}
+
+boost::shared_ptr<MetaList> MetaList::New(int elementType, const MetaObjectPtr& elementTemplate) {
+    if (elementType != META_STRING && elementType != META_STRUCT) {
+        throw std::invalid_argument("MetaList::New: a list holds strings (2) or records (3), not type " +
+                                    std::to_string(elementType));
+    }
+    return boost::shared_ptr<MetaList>(new MetaList(elementType, elementTemplate));
+}
+
+void MetaList::Append(const boost::shared_ptr<MetaString>& element) {
+    if (elementType_ != META_STRING || !element) {
+        throw std::invalid_argument("MetaList::Append: a string does not belong in this list");
+    }
+    elements_.push_back(element);
+}
+
+void MetaList::Append(const boost::shared_ptr<MetaStruct>& element) {
+    if (elementType_ != META_STRUCT || !element) {
+        throw std::invalid_argument("MetaList::Append: a record does not belong in this list");
+    }
+    elements_.push_back(element);
+}
+
+void MetaList::Append(const char* element) { Append(MetaString::New(element ? element : "")); }
+
+void MetaList::Append(const std::string& element) { Append(MetaString::New(element)); }
+
+}  // namespace MetaObj

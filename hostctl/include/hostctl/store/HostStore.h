@@ -1,0 +1,186 @@
+// The simulated host's state: one SQLite database per host.
+//
+// The host is a set of collections of JSON objects (NICs, switches, port
+// groups, ...) plus a few singleton objects ("system", "firewall"). Each
+// collection is a table of (key, parent, seq, doc): the object's key is made
+// from its key fields, its parent from its parent field, seq keeps the
+// library's order, and doc is the object itself as JSON. A host profile is the
+// same data as one JSON document (docs/host-profile.md); dump and load turn
+// one into the other.
+//
+// Only the host-control library and the host simulator tool use this header.
+#pragma once
+
+#include <cstdint>
+#include <functional>
+#include <memory>
+#include <optional>
+#include <stdexcept>
+#include <string>
+#include <vector>
+
+#include <nlohmann/json.hpp>
+
+struct sqlite3;
+
+namespace PldCtl {
+namespace Store {
+
+using Json = nlohmann::json;
+
+// The store cannot be used at all: it cannot be created or opened, or the
+// file is damaged, truncated or not a host store. Deliberately not a
+// HostCtlException: commands report those as their own failure, while this
+// one means the host itself is unusable. The message names the file.
+class StoreError : public std::runtime_error {
+public:
+    using std::runtime_error::runtime_error;
+};
+
+// A profile that cannot be used: bad JSON, unknown section, missing or
+// duplicate key, dangling reference. The message says where.
+class ProfileError : public std::runtime_error {
+public:
+    using std::runtime_error::runtime_error;
+};
+
+// A collection of objects: its profile section (also its table's name), the
+// fields that make an object's key (joined with "|"; no fields means the key
+// is the object's position), and the field naming its owner.
+struct CollectionInfo {
+    const char* section;
+    std::vector<const char*> keyFields;
+    const char* parentField;    // nullptr: no owner
+    const char* parentSection;  // where the owner must exist; nullptr: not checked
+};
+
+const std::vector<CollectionInfo>& Collections();
+// Throws std::invalid_argument for an unknown section.
+const CollectionInfo& Collection(const std::string& section);
+// The singleton sections, each one JSON object.
+const std::vector<std::string>& Singletons();
+
+constexpr const char* kProfileFormat = "orvix-host-profile";
+constexpr int kProfileVersion = 1;
+// The schema version of the database file (PRAGMA user_version).
+constexpr int kSchemaVersion = 1;
+
+// The embedded default host.
+const std::string& DefaultProfileText();
+// Parses and checks a profile; throws ProfileError.
+Json ParseProfile(const std::string& text, const std::string& origin);
+void ValidateProfile(const Json& profile);
+// The key an object has in its collection; throws ProfileError when a key
+// field is missing or not a string or integer.
+std::string KeyOf(const CollectionInfo& collection, const Json& object);
+
+// An injected fault: an operation named "Class::Operation" throws
+// HostCtlException with this message; with a key, only for that object.
+// remaining: how many more times it fires; nullopt means every time.
+struct Fault {
+    std::int64_t id = 0;
+    std::string operation;
+    std::string key;
+    std::string message;
+    std::optional<std::int64_t> remaining;
+};
+
+class HostStore;
+
+// Reads and writes inside one transaction (see HostStore::Change and Read).
+class Transaction {
+public:
+    std::optional<Json> Get(const std::string& section, const std::string& key);
+    bool Exists(const std::string& section, const std::string& key);
+    std::vector<Json> List(const std::string& section);
+    std::vector<Json> ListChildren(const std::string& section, const std::string& parent);
+    std::int64_t Count(const std::string& section);
+    std::int64_t CountChildren(const std::string& section, const std::string& parent);
+
+    // Writes an object; its key and parent come from its own fields. A new
+    // object goes to the end of its collection, an existing one keeps its place.
+    void Put(const std::string& section, const Json& object);
+    // Returns false when there was no such object.
+    bool Remove(const std::string& section, const std::string& key);
+    std::int64_t RemoveChildren(const std::string& section, const std::string& parent);
+
+    // {} when the singleton was never written.
+    Json GetSingleton(const std::string& name);
+    void PutSingleton(const std::string& name, const Json& object);
+
+private:
+    friend class HostStore;
+    explicit Transaction(HostStore& store) : store_(store) {}
+    HostStore& store_;
+};
+
+class HostStore {
+public:
+    // $ORVIX_HOST_DB, else ${XDG_STATE_HOME:-$HOME/.local/state}/orvix/host.db.
+    static std::string ResolvePath();
+    // The profile a missing store is created from: the file named by
+    // $ORVIX_HOST_PROFILE, else the embedded default. Throws StoreError
+    // when that file cannot be read.
+    static std::string ResolveProfileText();
+
+    // The process-wide store at ResolvePath(), opened on first use and created
+    // from ResolveProfileText() when the file does not exist. Throws StoreError.
+    static HostStore& Default();
+    // Forgets the process-wide store, so that the next Default() opens the
+    // path the environment names then (for tests).
+    static void ResetDefault();
+
+    // Opens an existing store. Throws StoreError when the file is missing,
+    // damaged, truncated, foreign or of a newer schema; the file is left
+    // exactly as it was.
+    static std::unique_ptr<HostStore> Open(const std::string& path);
+    // Opens the store, first creating it from the profile when the file does
+    // not exist. Several processes may race to create it: one wins, all open
+    // the same file. Throws ProfileError for a bad profile, StoreError else.
+    static std::unique_ptr<HostStore> OpenOrCreate(const std::string& path, const std::string& profileText);
+    // Creates a new store from a profile; throws StoreError when the file
+    // exists already.
+    static std::unique_ptr<HostStore> Create(const std::string& path, const std::string& profileText);
+
+    ~HostStore();
+    HostStore(const HostStore&) = delete;
+    HostStore& operator=(const HostStore&) = delete;
+
+    const std::string& Path() const { return path_; }
+
+    // Single reads, each consistent on its own.
+    std::optional<Json> Get(const std::string& section, const std::string& key);
+    std::vector<Json> List(const std::string& section);
+    std::vector<Json> ListChildren(const std::string& section, const std::string& parent);
+    Json GetSingleton(const std::string& name);
+
+    // Several reads that see one state of the host.
+    void Read(const std::function<void(Transaction&)>& fn);
+    // One change: fn runs inside one write transaction. A busy store is
+    // waited for and the transaction retried, so concurrent changes are
+    // serialised and none is lost. An exception from fn rolls everything back
+    // and propagates.
+    void Change(const std::function<void(Transaction&)>& fn);
+
+    // The whole host as a profile, and its replacement by one (one change).
+    Json Dump();
+    void Load(const Json& profile);
+
+    // Throws HostCtl::Lib::HostCtlException with the message of the first
+    // fault that matches the operation and key (a fault without key matches
+    // every key), using up one firing of a counted fault.
+    void CheckFault(const std::string& operation, const std::string& key = std::string());
+    std::vector<Fault> ListFaults();
+    std::int64_t AddFault(const Fault& fault);
+    void ClearFaults();
+
+private:
+    friend class Transaction;
+    struct Impl;
+    explicit HostStore(const std::string& path);
+    std::string path_;
+    std::unique_ptr<Impl> impl_;
+};
+
+}  // namespace Store
+}  // namespace PldCtl
