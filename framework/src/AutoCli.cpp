@@ -20,7 +20,9 @@ boost::shared_ptr<NamespaceNode> NamespaceNode::FindChild(const std::string& nam
     return boost::shared_ptr<NamespaceNode>();
 }
 
-boost::shared_ptr<Namespace> Namespace::New() { return boost::shared_ptr<Namespace>(new Namespace()); }
+boost::shared_ptr<Namespace> Namespace::New() {
+    return boost::shared_ptr<Namespace>(new Namespace());
+}
 
 Command::~Command() = default;
 

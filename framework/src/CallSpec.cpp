@@ -2,16 +2,20 @@
 
 #include <stdexcept>
 
-#include <boost/regex.hpp>
+#include <regex>
 
 namespace CallSpec {
 
 const char* ParameterTypeName(ParameterType type) {
     switch (type) {
-    case PARAM_STRING: return "string";
-    case PARAM_INT: return "long";
-    case PARAM_BOOL: return "bool";
-    case PARAM_FLAG: return "flag";
+        case PARAM_STRING:
+            return "string";
+        case PARAM_INT:
+            return "long";
+        case PARAM_BOOL:
+            return "bool";
+        case PARAM_FLAG:
+            return "flag";
     }
     return "unknown";
 }
@@ -32,7 +36,9 @@ void ParameterConstraint::SetIntRange(std::int64_t min, std::int64_t max) {
     max_ = max;
 }
 
-void ParameterConstraint::AddIntEnum(std::int64_t value) { intEnum_.push_back(value); }
+void ParameterConstraint::AddIntEnum(std::int64_t value) {
+    intEnum_.push_back(value);
+}
 
 void ParameterConstraint::AddStringEnum(const std::string& value, const std::string& description) {
     stringEnum_.push_back({value, description});
@@ -40,8 +46,8 @@ void ParameterConstraint::AddStringEnum(const std::string& value, const std::str
 
 void ParameterConstraint::SetStringRegex(const std::string& pattern) {
     try {
-        boost::regex check(pattern);
-    } catch (const boost::regex_error& e) {
+        std::regex check(pattern);
+    } catch (const std::regex_error& e) {
         throw std::invalid_argument("ParameterConstraint::SetStringRegex: bad pattern '" + pattern + "': " + e.what());
     }
     regex_ = pattern;
@@ -63,19 +69,22 @@ void ParameterSpec::SetShortName(const std::string& letter) {
     shortName_ = letter;
 }
 
-void ParameterSpec::SetShortName(char letter) { SetShortName(std::string(1, letter)); }
+void ParameterSpec::SetShortName(char letter) {
+    SetShortName(std::string(1, letter));
+}
 
-boost::shared_ptr<InputSpec> InputSpec::New() { return boost::shared_ptr<InputSpec>(new InputSpec()); }
+boost::shared_ptr<InputSpec> InputSpec::New() {
+    return boost::shared_ptr<InputSpec>(new InputSpec());
+}
 
 void InputSpec::AddParameter(const boost::shared_ptr<ParameterSpec>& parameter) {
     if (!parameter) throw std::invalid_argument("InputSpec::AddParameter: null parameter");
     if (FindByName(parameter->GetName())) {
-        throw std::invalid_argument("InputSpec::AddParameter: parameter '" + parameter->GetName() +
-                                    "' declared twice");
+        throw std::invalid_argument("InputSpec::AddParameter: parameter '" + parameter->GetName() + "' declared twice");
     }
     if (!parameter->GetShortName().empty() && FindByShortName(parameter->GetShortName())) {
-        throw std::invalid_argument("InputSpec::AddParameter: short name '" + parameter->GetShortName() +
-                                    "' of '" + parameter->GetName() + "' is taken");
+        throw std::invalid_argument("InputSpec::AddParameter: short name '" + parameter->GetShortName() + "' of '" +
+                                    parameter->GetName() + "' is taken");
     }
     parameters_.push_back(parameter);
 }
@@ -94,11 +103,17 @@ boost::shared_ptr<ParameterSpec> InputSpec::FindByShortName(const std::string& l
     return boost::shared_ptr<ParameterSpec>();
 }
 
-boost::shared_ptr<OutputSpec> OutputSpec::New() { return boost::shared_ptr<OutputSpec>(new OutputSpec()); }
+boost::shared_ptr<OutputSpec> OutputSpec::New() {
+    return boost::shared_ptr<OutputSpec>(new OutputSpec());
+}
 
-boost::shared_ptr<Input> Input::New() { return boost::shared_ptr<Input>(new Input()); }
+boost::shared_ptr<Input> Input::New() {
+    return boost::shared_ptr<Input>(new Input());
+}
 
-bool Input::IsSet(const std::string& name) const { return values_.count(name) != 0; }
+bool Input::IsSet(const std::string& name) const {
+    return values_.count(name) != 0;
+}
 
 std::string Input::GetString(const std::string& name) const {
     auto it = values_.find(name);
@@ -115,9 +130,13 @@ bool Input::GetBool(const std::string& name) const {
     return it != values_.end() && it->second.boolValue;
 }
 
-bool Input::GetFlag(const std::string& name) const { return GetBool(name); }
+bool Input::GetFlag(const std::string& name) const {
+    return GetBool(name);
+}
 
-void Input::SetString(const std::string& name, const std::string& text) { values_[name] = Value{text, 0, false}; }
+void Input::SetString(const std::string& name, const std::string& text) {
+    values_[name] = Value{text, 0, false};
+}
 
 void Input::SetInt(const std::string& name, const std::string& text, std::int64_t value) {
     values_[name] = Value{text, value, false};
@@ -127,11 +146,17 @@ void Input::SetBool(const std::string& name, const std::string& text, bool value
     values_[name] = Value{text, 0, value};
 }
 
-void Input::SetFlag(const std::string& name) { values_[name] = Value{"", 0, true}; }
+void Input::SetFlag(const std::string& name) {
+    values_[name] = Value{"", 0, true};
+}
 
-boost::shared_ptr<Output> Output::New() { return boost::shared_ptr<Output>(new Output()); }
+boost::shared_ptr<Output> Output::New() {
+    return boost::shared_ptr<Output>(new Output());
+}
 
-void Output::SetError(const std::string& message) { errors_.push_back(message); }
+void Output::SetError(const std::string& message) {
+    errors_.push_back(message);
+}
 
 CallTarget::~CallTarget() = default;
 

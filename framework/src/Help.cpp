@@ -1,1 +1,119 @@
-// placeholder
+// Help at every level of the tree, generated from the tree itself: the
+// children a namespace really has, the parameters a command really declares.
+#include <algorithm>
+
+#include "framework/Format.h"
+#include "framework/Runner.h"
+
+namespace AutoCli {
+
+namespace {
+
+// Options the CLI understands wherever they appear.
+const char* const kGlobalOptions[][2] = {
+    {"--formatter=<str>", "Override the output formatter: "},
+    {"-h|--help", "Show the help of the namespace or command."},
+    {"--version", "Print the version of the CLI and exit."},
+};
+
+std::string Joined(const std::vector<std::string>& names) {
+    std::string joined;
+    for (const auto& n : names) joined += (joined.empty() ? "" : ", ") + n;
+    return joined;
+}
+
+void RenderChildren(const NamespaceNode& node, bool commands, const char* title, std::ostream& out) {
+    std::size_t width = 0;
+    for (const auto& child : node.GetChildren()) {
+        if ((child.second->AsCommand() != nullptr) == commands) width = std::max(width, child.first.size());
+    }
+    if (width == 0) return;
+    out << "\n" << title << ":\n";
+    for (const auto& child : node.GetChildren()) {
+        if ((child.second->AsCommand() != nullptr) != commands) continue;
+        out << "  " << child.first << std::string(width - child.first.size() + 2, ' ') << child.second->GetDescription()
+            << "\n";
+    }
+}
+
+std::string OptionSynopsis(const CallSpec::ParameterSpec& p) {
+    std::string synopsis = "  ";
+    if (!p.GetShortName().empty()) synopsis += "-" + p.GetShortName() + "|";
+    synopsis += "--" + p.GetName();
+    switch (p.GetType()) {
+        case CallSpec::PARAM_STRING:
+            synopsis += "=<str>";
+            break;
+        case CallSpec::PARAM_INT:
+            synopsis += "=<long>";
+            break;
+        case CallSpec::PARAM_BOOL:
+            synopsis += "=<bool>";
+            break;
+        case CallSpec::PARAM_FLAG:
+            break;
+    }
+    return synopsis + (p.IsRequired() ? "  (required)" : "");
+}
+
+std::string ReplaceAll(std::string text, const std::string& token, const std::string& value) {
+    for (std::size_t at = text.find(token); at != std::string::npos; at = text.find(token, at + value.size())) {
+        text.replace(at, token.size(), value);
+    }
+    return text;
+}
+
+}  // namespace
+
+std::string ExpandDescription(const CallSpec::ParameterSpec& parameter, const std::string& indent) {
+    std::string text = parameter.GetDescription();
+    const auto& c = parameter.GetConstraint();
+    if (!c) return text;
+    std::vector<std::string> values;
+    std::string full;
+    if (c->GetType() == CallSpec::CONSTRAINT_STRING_ENUM) {
+        for (const auto& e : c->GetStringEnum()) {
+            values.push_back(e.value);
+            full += "\n" + indent + (e.description.empty() ? e.value : e.value + ": " + e.description);
+        }
+    } else if (c->GetType() == CallSpec::CONSTRAINT_INT_ENUM) {
+        for (std::int64_t v : c->GetIntEnum()) {
+            values.push_back(std::to_string(v));
+            full += "\n" + indent + std::to_string(v);
+        }
+    }
+    text = ReplaceAll(text, "%FULLENUM%", full);
+    return ReplaceAll(text, "%ENUM%", Joined(values));
+}
+
+void RenderNamespaceHelp(const NamespaceNode& node, const std::string& program, const std::string& path,
+                         std::ostream& out) {
+    out << "Usage: " << program << (path.empty() ? " [options]" : " " + path) << " {namespace|cmd} [cmd options]\n";
+    if (!node.GetDescription().empty()) out << "\n" << node.GetDescription() << "\n";
+    if (path.empty()) {
+        out << "\nOptions:\n";
+        for (const auto& option : kGlobalOptions) {
+            std::string text = option[1];
+            if (std::string(option[0]).rfind("--formatter", 0) == 0) text += Joined(FormatterNames()) + ".";
+            out << "  " << option[0] << std::string(20 - std::string(option[0]).size(), ' ') << text << "\n";
+        }
+    }
+    RenderChildren(node, false, "Available Namespaces", out);
+    RenderChildren(node, true, "Available Commands", out);
+    out << "\nFor help on a namespace or command: " << program << (path.empty() ? "" : " " + path)
+        << " <name> --help\n";
+}
+
+void RenderCommandHelp(Command& command, const std::string& program, const std::string& path, std::ostream& out) {
+    boost::shared_ptr<CallSpec::InputSpec> declared = command.GetInputSpec();
+    out << "Usage: " << program << " " << path << (declared->GetParameters().empty() ? "" : " [cmd options]") << "\n";
+    out << "\nDescription:\n  " << command.GetDescription() << "\n";
+    if (declared->GetParameters().empty()) return;
+    out << "\nCmd options:\n";
+    for (const auto& p : declared->GetParameters()) {
+        out << OptionSynopsis(*p) << "\n";
+        out << "      " << ExpandDescription(*p, "        ") << "\n";
+    }
+}
+
+}  // namespace AutoCli

@@ -7,18 +7,25 @@ namespace MetaObj {
 
 const char* MetaTypeName(int type) {
     switch (type) {
-    case META_BOOL: return "bool";
-    case META_INT: return "int";
-    case META_STRING: return "string";
-    case META_STRUCT: return "struct";
-    case META_LIST: return "list";
+        case META_BOOL:
+            return "bool";
+        case META_INT:
+            return "int";
+        case META_STRING:
+            return "string";
+        case META_STRUCT:
+            return "struct";
+        case META_LIST:
+            return "list";
     }
     return "unknown";
 }
 
 MetaObject::~MetaObject() = default;
 
-boost::shared_ptr<MetaString> MetaString::New() { return boost::shared_ptr<MetaString>(new MetaString()); }
+boost::shared_ptr<MetaString> MetaString::New() {
+    return boost::shared_ptr<MetaString>(new MetaString());
+}
 
 boost::shared_ptr<MetaString> MetaString::New(const std::string& value) {
     boost::shared_ptr<MetaString> s(new MetaString());
@@ -27,7 +34,9 @@ boost::shared_ptr<MetaString> MetaString::New(const std::string& value) {
     return s;
 }
 
-boost::shared_ptr<MetaInt> MetaInt::New() { return boost::shared_ptr<MetaInt>(new MetaInt()); }
+boost::shared_ptr<MetaInt> MetaInt::New() {
+    return boost::shared_ptr<MetaInt>(new MetaInt());
+}
 
 boost::shared_ptr<MetaInt> MetaInt::New(std::int64_t value) {
     boost::shared_ptr<MetaInt> i(new MetaInt());
@@ -48,7 +57,9 @@ std::string MetaInt::ToString() const {
     return isUnsigned_ ? std::to_string(bits_) : std::to_string(static_cast<std::int64_t>(bits_));
 }
 
-boost::shared_ptr<MetaBool> MetaBool::New() { return boost::shared_ptr<MetaBool>(new MetaBool()); }
+boost::shared_ptr<MetaBool> MetaBool::New() {
+    return boost::shared_ptr<MetaBool>(new MetaBool());
+}
 
 boost::shared_ptr<MetaBool> MetaBool::New(bool value) {
     boost::shared_ptr<MetaBool> b(new MetaBool());
@@ -80,10 +91,18 @@ void MetaStruct::SetField(const std::string& name, const std::string& value) {
 void MetaStruct::SetField(const std::string& name, const char* value) {
     SetField(name, MetaString::New(value ? value : ""));
 }
-void MetaStruct::SetField(const std::string& name, bool value) { SetField(name, MetaBool::New(value)); }
-void MetaStruct::SetField(const std::string& name, int value) { SetField(name, MetaInt::New(value)); }
-void MetaStruct::SetField(const std::string& name, long value) { SetField(name, MetaInt::New(value)); }
-void MetaStruct::SetField(const std::string& name, long long value) { SetField(name, MetaInt::New(value)); }
+void MetaStruct::SetField(const std::string& name, bool value) {
+    SetField(name, MetaBool::New(value));
+}
+void MetaStruct::SetField(const std::string& name, int value) {
+    SetField(name, MetaInt::New(value));
+}
+void MetaStruct::SetField(const std::string& name, long value) {
+    SetField(name, MetaInt::New(value));
+}
+void MetaStruct::SetField(const std::string& name, long long value) {
+    SetField(name, MetaInt::New(value));
+}
 void MetaStruct::SetField(const std::string& name, unsigned int value) {
     SetField(name, MetaInt::NewUnsigned(value));
 }
@@ -128,8 +147,12 @@ void MetaList::Append(const boost::shared_ptr<MetaStruct>& element) {
     elements_.push_back(element);
 }
 
-void MetaList::Append(const char* element) { Append(MetaString::New(element ? element : "")); }
+void MetaList::Append(const char* element) {
+    Append(MetaString::New(element ? element : ""));
+}
 
-void MetaList::Append(const std::string& element) { Append(MetaString::New(element)); }
+void MetaList::Append(const std::string& element) {
+    Append(MetaString::New(element));
+}
 
 }  // namespace MetaObj

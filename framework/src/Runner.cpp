@@ -1,1 +1,193 @@
-// placeholder
+// One run of the CLI: resolve the command path, handle the options every
+// command understands (--help, --formatter, --version), parse and check the
+// command's own arguments, execute, render, and map the outcome to an exit
+// status. This is the only place that decides exit statuses.
+#include <sstream>
+
+#include "framework/Format.h"
+#include "framework/Runner.h"
+
+namespace AutoCli {
+
+namespace {
+
+struct CommandLine {
+    std::vector<std::string> pathWords;
+    boost::shared_ptr<CallSpec::InputSpec> parameters;  // of the command, once the path reaches one
+    std::vector<std::string> commandArgs;
+    boost::shared_ptr<NamespaceNode> node;
+    std::string formatter;
+    bool help = false;
+    bool version = false;
+};
+
+std::string JoinPath(const std::vector<std::string>& words) {
+    std::string path;
+    for (const auto& w : words) path += (path.empty() ? "" : " ") + w;
+    return path;
+}
+
+bool IsOption(const std::string& token) {
+    return !token.empty() && token[0] == '-';
+}
+
+std::string FormatterList() {
+    std::string names;
+    for (const auto& n : FormatterNames()) names += (names.empty() ? "" : ", ") + n;
+    return names;
+}
+
+// Walks the tree along the leading words, collecting the global options met
+// on the way and after the command. Throws UsageError.
+CommandLine Resolve(const boost::shared_ptr<NamespaceNode>& root, const std::vector<std::string>& args) {
+    CommandLine line;
+    line.node = root;
+    bool formatterGiven = false;
+    for (std::size_t i = 0; i < args.size(); ++i) {
+        const std::string& token = args[i];
+        Command* command = line.node->AsCommand();
+        // A command may declare options of these names; then they are its own.
+        auto own = [&](const std::string& name, const std::string& letter) {
+            return line.parameters &&
+                   (line.parameters->FindByName(name) || (!letter.empty() && line.parameters->FindByShortName(letter)));
+        };
+        if ((token == "--help" && !own("help", "")) || (token == "-h" && !own("", "h"))) {
+            line.help = true;
+        } else if (token == "--version" && !command) {
+            line.version = true;
+        } else if (token.compare(0, 11, "--formatter") == 0 && (token.size() == 11 || token[11] == '=') &&
+                   !own("formatter", "")) {
+            if (formatterGiven) throw UsageError("Option --formatter is given more than once");
+            formatterGiven = true;
+            if (token.size() > 11) {
+                line.formatter = token.substr(12);
+            } else if (i + 1 < args.size() && !IsOption(args[i + 1])) {
+                line.formatter = args[++i];
+            } else {
+                throw UsageError("Option --formatter needs a value: one of " + FormatterList());
+            }
+        } else if (command) {
+            line.commandArgs.push_back(token);
+        } else if (IsOption(token)) {
+            if (line.help) continue;
+            throw UsageError("Unknown option " + token +
+                             (line.pathWords.empty() ? std::string() : " for '" + JoinPath(line.pathWords) + "'"));
+        } else {
+            boost::shared_ptr<NamespaceNode> child = line.node->FindChild(token);
+            if (!child) {
+                std::vector<std::string> names;
+                for (const auto& c : line.node->GetChildren()) names.push_back(c.first);
+                std::string message = "Unknown command or namespace '" + token + "'";
+                if (!line.pathWords.empty()) message += " in '" + JoinPath(line.pathWords) + "'";
+                std::string suggestion = SuggestClosest(token, names);
+                if (!suggestion.empty()) message += ". Did you mean '" + suggestion + "'?";
+                throw UsageError(message);
+            }
+            line.pathWords.push_back(token);
+            line.node = child;
+            if (Command* reached = child->AsCommand()) line.parameters = reached->GetInputSpec();
+        }
+    }
+    if (!line.formatter.empty() && !FindFormatter(line.formatter)) {
+        std::string message = "Unknown formatter '" + line.formatter + "'";
+        std::string suggestion = SuggestClosest(line.formatter, FormatterNames());
+        if (!suggestion.empty()) message += ". Did you mean '" + suggestion + "'?";
+        throw UsageError(message + " Formatters: " + FormatterList());
+    }
+    return line;
+}
+
+int Execute(Command& command, const CommandLine& line, std::ostream& out, std::ostream& err,
+            const RunOptions& options) {
+    const std::string path = JoinPath(line.pathWords);
+    boost::shared_ptr<CallSpec::Input> input;
+    try {
+        input = ParseArguments(*line.parameters, line.commandArgs);
+    } catch (const UsageError& e) {
+        err << options.program << ": " << e.what() << "\n"
+            << "Run '" << options.program << " " << path << " --help' for its options.\n";
+        return kExitUsage;
+    }
+
+    boost::shared_ptr<CallSpec::OutputSpec> outputSpec = command.GetOutputSpec();
+    boost::shared_ptr<CallSpec::Output> output = CallSpec::Output::New();
+    command.Execute(input, output);
+
+    // A result that does not match the declared output, or one never
+    // completed, is a fault of the command; nothing of it is shown.
+    const auto& result = output->GetResult();
+    if (result && !output->IsComplete()) {
+        err << options.program << ": internal error: '" << path << "' set a result without completing\n";
+        return kExitFailure;
+    }
+    const auto& declared = outputSpec ? outputSpec->GetTemplate() : MetaObj::MetaObjectPtr();
+    if (result && declared && declared->GetType() != result->GetType()) {
+        err << options.program << ": internal error: '" << path << "' returned a "
+            << MetaObj::MetaTypeName(result->GetType()) << " but declares a "
+            << MetaObj::MetaTypeName(declared->GetType()) << "\n";
+        return kExitFailure;
+    }
+    if (result) {
+        std::string name = line.formatter;
+        if (name.empty()) name = command.GetDefaultOutputFormatter();
+        if (name.empty()) name = "simple";
+        const Formatter* formatter = FindFormatter(name);
+        if (!formatter) {
+            err << options.program << ": internal error: '" << path << "' names an unknown formatter '" << name
+                << "'\n";
+            return kExitFailure;
+        }
+        // Rendered to a buffer first, so a formatter failure never leaves
+        // half a document on stdout.
+        std::ostringstream rendered;
+        formatter->Render(result, FormatHints(command.GetDefaultOutputParameters()), rendered);
+        out << rendered.str();
+    }
+    for (const auto& message : output->GetErrors()) err << message << "\n";
+    return output->HasError() ? kExitCommandError : kExitOk;
+}
+
+}  // namespace
+
+int Run(const boost::shared_ptr<NamespaceNode>& root, const std::vector<std::string>& args, std::ostream& out,
+        std::ostream& err, const RunOptions& options) {
+    try {
+        CommandLine line;
+        try {
+            line = Resolve(root, args);
+        } catch (const UsageError& e) {
+            err << options.program << ": " << e.what() << "\n";
+            return kExitUsage;
+        }
+        const std::string path = JoinPath(line.pathWords);
+        if (line.version) {
+            out << options.program << " " << options.version << "\n";
+            return kExitOk;
+        }
+        Command* command = line.node->AsCommand();
+        if (line.help) {
+            if (command) {
+                RenderCommandHelp(*command, options.program, path, out);
+            } else {
+                RenderNamespaceHelp(*line.node, options.program, path, out);
+            }
+            return kExitOk;
+        }
+        if (!command) {
+            if (!line.pathWords.empty()) {
+                err << options.program << ": '" << path << "' is a namespace; give one of its commands\n\n";
+            }
+            RenderNamespaceHelp(*line.node, options.program, path, err);
+            return kExitUsage;
+        }
+        return Execute(*command, line, out, err, options);
+    } catch (const std::exception& e) {
+        err << options.program << ": " << e.what() << "\n";
+        return kExitFailure;
+    } catch (...) {
+        err << options.program << ": internal error: unknown exception\n";
+        return kExitFailure;
+    }
+}
+
+}  // namespace AutoCli

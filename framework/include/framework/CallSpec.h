@@ -48,7 +48,7 @@ public:
     void SetIntRange(std::int64_t min, std::int64_t max);
     void AddIntEnum(std::int64_t value);
     void AddStringEnum(const std::string& value, const std::string& description);
-    // A pattern the whole value must match (Perl syntax). Throws
+    // A pattern the whole value must match (ECMAScript syntax). Throws
     // std::invalid_argument when the pattern does not compile.
     void SetStringRegex(const std::string& pattern);
 

@@ -1,0 +1,67 @@
+// Running one command line against a command tree: resolve the path, parse
+// and check the arguments, execute, render, and choose the exit status.
+#pragma once
+
+#include <cstdint>
+#include <ostream>
+#include <stdexcept>
+#include <string>
+#include <vector>
+
+#include <boost/shared_ptr.hpp>
+
+#include "framework/AutoCli.h"
+
+namespace AutoCli {
+
+// Exit statuses, the one table every run maps its outcome to.
+enum ExitStatus {
+    kExitOk = 0,             // success
+    kExitCommandError = 1,  // the command reported an error (its messages on stderr)
+    kExitUsage = 2,          // the command line was wrong (unknown command/option, bad value, ...)
+    kExitFailure = 3,        // the host or the tool itself failed (e.g. the host store cannot be opened)
+};
+
+// A command line the framework refuses before the command runs.
+class UsageError : public std::runtime_error {
+public:
+    using std::runtime_error::runtime_error;
+};
+
+// Parses a command's arguments (everything after the command path) against
+// its input specification: --long=value, --long value, -s value, -s=value;
+// flags take no value; bools take true/false, 1/0, yes/no in any case; ints
+// are signed 64-bit decimal. Checks unknown, repeated and missing required
+// options, types and constraints. Throws UsageError with a one-line message.
+boost::shared_ptr<CallSpec::Input> ParseArguments(const CallSpec::InputSpec& declared,
+                                                  const std::vector<std::string>& args);
+
+// Parses a bool word; false when the word is not one.
+bool ParseBoolWord(const std::string& text, bool& value);
+// Parses a signed 64-bit decimal; false on anything else (blanks, overflow).
+bool ParseInt64(const std::string& text, std::int64_t& value);
+
+// The closest of the candidates to a mistyped word, or "" when none is close.
+std::string SuggestClosest(const std::string& word, const std::vector<std::string>& candidates);
+
+// Help texts. `path` is the command path as typed ("network ip set").
+void RenderNamespaceHelp(const NamespaceNode& node, const std::string& program, const std::string& path,
+                         std::ostream& out);
+void RenderCommandHelp(Command& command, const std::string& program, const std::string& path,
+                       std::ostream& out);
+// A parameter description with %ENUM% and %FULLENUM% expanded from its
+// constraint: %ENUM% by the values joined with ", ", %FULLENUM% by one line
+// per value ("value: description", or the value alone without description).
+std::string ExpandDescription(const CallSpec::ParameterSpec& parameter, const std::string& indent);
+
+struct RunOptions {
+    std::string program = "orvixcli";
+    std::string version;
+};
+
+// Runs one command line. Never throws: whatever a command lets escape is
+// reported on `err` and gives kExitFailure.
+int Run(const boost::shared_ptr<NamespaceNode>& root, const std::vector<std::string>& args, std::ostream& out,
+        std::ostream& err, const RunOptions& options = RunOptions());
+
+}  // namespace AutoCli

@@ -1,0 +1,107 @@
+// What the six formatters share: which values count as present, which fields
+// of a record are shown and in what order, how a value reads inside one line
+// or one cell, the columns of a table, and UTF-8 handling for the machine
+// formats. Private to the framework library.
+#pragma once
+
+#include <cstddef>
+#include <optional>
+#include <string>
+#include <vector>
+
+#include "framework/Format.h"
+
+namespace AutoCli {
+namespace Formatting {
+
+using MetaObj::MetaList;
+using MetaObj::MetaObject;
+using MetaObj::MetaObjectPtr;
+using MetaObj::MetaStruct;
+
+// A value is present when it exists and holds a value. A scalar template
+// (made without a value) is treated everywhere like a field never set.
+bool IsPresent(const MetaObjectPtr& value);
+
+// Typed views of a value; null when it is of another kind.
+const MetaStruct* AsRecord(const MetaObjectPtr& value);
+const MetaList* AsList(const MetaObjectPtr& value);
+bool IsRecordList(const MetaObjectPtr& value);
+
+// "abc", "42", "true": the text of a string, int or bool.
+std::string ScalarText(const MetaObject& value);
+
+// The elements of a list that are present, in order.
+std::vector<MetaObjectPtr> PresentElements(const MetaList& list);
+
+// The present fields of a record in display order. With the record type's
+// "fields:" hint, the hinted fields the record has come first, in hint order;
+// HintedOnly stops there (the human formats), HintedFirst then adds the
+// record's other fields in record order (the machine formats). A hint that
+// matches none of the record's fields is ignored.
+enum class FieldSelection { HintedOnly, HintedFirst };
+std::vector<MetaStruct::Field> SelectFields(const MetaStruct& record, const FormatHints& hints,
+                                            FieldSelection selection);
+
+// How a value reads inside one line or one table cell.
+struct InlineStyle {
+    const char* listSeparator;  // between the items of a string list
+    bool units;                 // a scalar is followed by its unit word, if any
+};
+
+// The one-line text of a field's value: a scalar (with its unit when the
+// style asks), a string list joined, a record as "{Name: value, ...}", a list
+// of records as such items joined by ", ".
+std::string InlineText(const MetaObjectPtr& value, const std::string& type, const std::string& field,
+                       const FormatHints& hints, const InlineStyle& style);
+
+// A result laid out as columns and rows of cell text, for table and csv.
+struct Table {
+    std::vector<std::string> columns;
+    std::vector<std::vector<std::string>> rows;
+};
+
+// Lays out a record (one row) or a list of records. Returns false for any
+// other result, which the caller renders in its own way.
+bool BuildTable(const MetaObject& result, const FormatHints& hints, const InlineStyle& style, Table& table);
+
+// Decodes the character at `pos` and returns the number of bytes it takes.
+// A byte that does not begin a well-formed UTF-8 sequence (truncated,
+// overlong, a surrogate, above U+10FFFF) decodes as U+FFFD and takes one byte.
+std::size_t DecodeUtf8(const std::string& text, std::size_t pos, char32_t& codePoint);
+// True when DecodeUtf8 stood in for a bad byte rather than read a real U+FFFD.
+inline bool IsBadByte(char32_t codePoint, std::size_t length) { return codePoint == 0xFFFD && length == 1; }
+
+// Rewrites a text character by character. `replace` is called with each
+// character (a bad byte as U+FFFD, with badByte set) and returns the text to
+// put in its place, or nullopt to keep the character as it was.
+template <typename Replace>
+std::string Recode(const std::string& text, Replace replace) {
+    std::string out;
+    for (std::size_t pos = 0; pos < text.size();) {
+        char32_t c;
+        std::size_t length = DecodeUtf8(text, pos, c);
+        if (std::optional<std::string> replacement = replace(c, IsBadByte(c, length))) {
+            out += *replacement;
+        } else {
+            out.append(text, pos, length);
+        }
+        pos += length;
+    }
+    return out;
+}
+
+// The number of characters of a text, for lining up columns.
+std::size_t DisplayWidth(const std::string& text);
+
+// The work of each formatter, given a present result (never null, never a
+// scalar template). Formatters.cpp binds them to their names.
+void WriteSimple(const MetaObject& result, const FormatHints& hints, std::ostream& out);
+void WriteTable(const MetaObject& result, const FormatHints& hints, std::ostream& out);
+void WriteJson(const MetaObject& result, const FormatHints& hints, std::ostream& out);
+void WriteXml(const MetaObject& result, const FormatHints& hints, std::ostream& out);
+void WriteCsv(const MetaObject& result, const FormatHints& hints, std::ostream& out);
+void WriteKeyValue(const MetaObject& result, const FormatHints& hints, std::ostream& out);
+
+}  // namespace Formatting
+}  // namespace AutoCli

@@ -1,0 +1,72 @@
+// One "key=value" line per scalar, the key spelling out the path to it
+// ("VirtualSwitch.Uplinks[1]"), so that grep and cut find any value.
+#include "Common.h"
+
+namespace AutoCli {
+namespace Formatting {
+
+namespace {
+
+std::string Escape(const std::string& text) {
+    std::string escaped;
+    for (char c : text) {
+        switch (c) {
+        case '\\': escaped += "\\\\"; break;
+        case '\n': escaped += "\\n"; break;
+        case '\r': escaped += "\\r"; break;
+        default: escaped += c;
+        }
+    }
+    return escaped;
+}
+
+class KeyValueWriter {
+public:
+    KeyValueWriter(const FormatHints& hints, std::ostream& out) : hints_(hints), out_(out) {}
+
+    // Lists of records at the top name each element by its own type; every
+    // other list inherits the key of what holds it.
+    void Result(const MetaObject& result) {
+        if (const auto* record = dynamic_cast<const MetaStruct*>(&result)) {
+            Value(record->GetTypeName(), result);
+        } else if (const auto* list = dynamic_cast<const MetaList*>(&result)) {
+            std::vector<MetaObjectPtr> elements = PresentElements(*list);
+            for (std::size_t i = 0; i < elements.size(); ++i) {
+                const MetaStruct* record = AsRecord(elements[i]);
+                Value(Indexed(record ? record->GetTypeName() : "", i), *elements[i]);
+            }
+        } else {
+            Value("value", result);
+        }
+    }
+
+private:
+    static std::string Indexed(const std::string& key, std::size_t index) {
+        return key + "[" + std::to_string(index) + "]";
+    }
+
+    void Value(const std::string& key, const MetaObject& value) {
+        if (const auto* record = dynamic_cast<const MetaStruct*>(&value)) {
+            for (const auto& field : SelectFields(*record, hints_, FieldSelection::HintedFirst)) {
+                Value(key + "." + field.first, *field.second);
+            }
+        } else if (const auto* list = dynamic_cast<const MetaList*>(&value)) {
+            std::vector<MetaObjectPtr> elements = PresentElements(*list);
+            for (std::size_t i = 0; i < elements.size(); ++i) Value(Indexed(key, i), *elements[i]);
+        } else {
+            out_ << key << '=' << Escape(ScalarText(value)) << '\n';
+        }
+    }
+
+    const FormatHints& hints_;
+    std::ostream& out_;
+};
+
+}  // namespace
+
+void WriteKeyValue(const MetaObject& result, const FormatHints& hints, std::ostream& out) {
+    KeyValueWriter(hints, out).Result(result);
+}
+
+}  // namespace Formatting
+}  // namespace AutoCli

@@ -1,0 +1,240 @@
+// A whole run in-process: path resolution, help at every level, formatter
+// choice, exit statuses, and what happens when a command misbehaves.
+#include <sstream>
+
+#include <gtest/gtest.h>
+
+#include "framework/Runner.h"
+
+namespace {
+
+// A command whose behaviour the test chooses.
+class FakeCommand : public virtual AutoCli::Command {
+public:
+    enum Behaviour { kRecord, kErrors, kRecordAndError, kThrow, kNoComplete, kWrongType, kNothing };
+
+    static boost::shared_ptr<FakeCommand> New(Behaviour b) {
+        boost::shared_ptr<FakeCommand> c(new FakeCommand());
+        c->behaviour_ = b;
+        c->SetDescription("Do a fake thing");
+        c->SetDefaultOutputFormatter("simple");
+        c->SetDefaultOutputParameter("header:Thing", "Thing %Name%");
+        return c;
+    }
+
+    boost::shared_ptr<CallSpec::InputSpec> GetInputSpecInternal() override {
+        auto declared = CallSpec::InputSpec::New();
+        auto name = CallSpec::ParameterSpec::New("name", CallSpec::PARAM_STRING);
+        name->SetShortName("n");
+        name->SetDescription("The name. One of: %ENUM%. In full: %FULLENUM%");
+        name->SetRequired(true);
+        auto words = CallSpec::ParameterConstraint::New(CallSpec::CONSTRAINT_STRING_ENUM);
+        words->AddStringEnum("alpha", "The first one");
+        words->AddStringEnum("beta", "");
+        name->SetConstraint(words);
+        declared->AddParameter(name);
+        auto flag = CallSpec::ParameterSpec::New("force", CallSpec::PARAM_FLAG);
+        flag->SetShortName("f");
+        flag->SetDescription("Force it");
+        declared->AddParameter(flag);
+        return declared;
+    }
+    boost::shared_ptr<CallSpec::OutputSpec> GetOutputSpecInternal() override {
+        auto declared = CallSpec::OutputSpec::New();
+        declared->SetTemplate(MetaObj::MetaStruct::New("Thing"));
+        return declared;
+    }
+    void ExecuteInternal(boost::shared_ptr<CallSpec::Input> in, boost::shared_ptr<CallSpec::Output> out) override {
+        auto record = MetaObj::MetaStruct::New("Thing");
+        record->SetField("Name", in->GetString("name"));
+        record->SetField("Forced", in->GetFlag("force"));
+        switch (behaviour_) {
+            case kRecord:
+                out->SetResult(record);
+                out->Complete();
+                break;
+            case kErrors:
+                out->SetError("first problem");
+                out->SetError("second problem");
+                break;
+            case kRecordAndError:
+                out->SetError("partial");
+                out->SetResult(record);
+                out->Complete();
+                break;
+            case kThrow:
+                throw std::runtime_error("host store '/x/host.db' is damaged");
+            case kNoComplete:
+                out->SetResult(record);
+                break;
+            case kWrongType:
+                out->SetResult(MetaObj::MetaString::New("oops"));
+                out->Complete();
+                break;
+            case kNothing:
+                break;
+        }
+    }
+
+private:
+    FakeCommand() = default;
+    Behaviour behaviour_ = kRecord;
+};
+
+boost::shared_ptr<AutoCli::Namespace> Tree() {
+    auto root = AutoCli::Namespace::New();
+    auto top = AutoCli::Namespace::New();
+    top->SetDescription("Top things");
+    auto inner = AutoCli::Namespace::New();
+    inner->SetDescription("Inner things");
+    inner->RegisterNamespaceNode(FakeCommand::New(FakeCommand::kRecord), "get");
+    inner->RegisterNamespaceNode(FakeCommand::New(FakeCommand::kErrors), "fail");
+    inner->RegisterNamespaceNode(FakeCommand::New(FakeCommand::kRecordAndError), "partial");
+    inner->RegisterNamespaceNode(FakeCommand::New(FakeCommand::kThrow), "crash");
+    inner->RegisterNamespaceNode(FakeCommand::New(FakeCommand::kNoComplete), "incomplete");
+    inner->RegisterNamespaceNode(FakeCommand::New(FakeCommand::kWrongType), "wrongtype");
+    inner->RegisterNamespaceNode(FakeCommand::New(FakeCommand::kNothing), "silent");
+    top->RegisterNamespaceNode(FakeCommand::New(FakeCommand::kRecord), "list");
+    top->RegisterNamespaceNode(inner, "inner");
+    root->RegisterNamespaceNode(top, "top");
+    return root;
+}
+
+struct Outcome {
+    int status;
+    std::string out, err;
+};
+
+Outcome RunLine(const std::vector<std::string>& args) {
+    std::ostringstream out, err;
+    AutoCli::RunOptions options;
+    options.program = "tool";
+    options.version = "9.9";
+    int status = AutoCli::Run(Tree(), args, out, err, options);
+    return {status, out.str(), err.str()};
+}
+
+TEST(Runner, RunsACommandWithItsDefaultOrAChosenFormatter) {
+    Outcome o = RunLine({"top", "inner", "get", "--name", "alpha"});
+    EXPECT_EQ(o.status, 0);
+    EXPECT_EQ(o.out, "Thing alpha\n   Name: alpha\n   Forced: false\n");
+    EXPECT_EQ(o.err, "");
+
+    // --formatter may stand before the path or among the options.
+    for (auto args : {std::vector<std::string>{"--formatter=json", "top", "inner", "get", "-n", "beta", "-f"},
+                      std::vector<std::string>{"top", "inner", "get", "-n", "beta", "--formatter", "json", "-f"}}) {
+        o = RunLine(args);
+        EXPECT_EQ(o.status, 0);
+        EXPECT_EQ(o.out, "{\n  \"Name\": \"beta\",\n  \"Forced\": true\n}\n");
+    }
+}
+
+TEST(Runner, MapsOutcomesToExitStatuses) {
+    Outcome o = RunLine({"top", "inner", "fail", "-n", "alpha"});
+    EXPECT_EQ(o.status, AutoCli::kExitCommandError);
+    EXPECT_EQ(o.out, "");
+    EXPECT_EQ(o.err, "first problem\nsecond problem\n");
+
+    // A result that comes with an error is still printed.
+    o = RunLine({"top", "inner", "partial", "-n", "alpha"});
+    EXPECT_EQ(o.status, AutoCli::kExitCommandError);
+    EXPECT_EQ(o.out, "Thing alpha\n   Name: alpha\n   Forced: false\n");
+    EXPECT_EQ(o.err, "partial\n");
+
+    // Whatever escapes a command is reported, never a crash.
+    o = RunLine({"top", "inner", "crash", "-n", "alpha"});
+    EXPECT_EQ(o.status, AutoCli::kExitFailure);
+    EXPECT_EQ(o.err, "tool: host store '/x/host.db' is damaged\n");
+
+    o = RunLine({"top", "inner", "incomplete", "-n", "alpha"});
+    EXPECT_EQ(o.status, AutoCli::kExitFailure);
+    EXPECT_EQ(o.out, "");
+    EXPECT_EQ(o.err, "tool: internal error: 'top inner incomplete' set a result without completing\n");
+
+    o = RunLine({"top", "inner", "wrongtype", "-n", "alpha"});
+    EXPECT_EQ(o.status, AutoCli::kExitFailure);
+    EXPECT_EQ(o.err, "tool: internal error: 'top inner wrongtype' returned a string but declares a struct\n");
+
+    o = RunLine({"top", "inner", "silent", "-n", "alpha"});
+    EXPECT_EQ(o.status, 0);
+    EXPECT_EQ(o.out + o.err, "");
+}
+
+TEST(Runner, RefusesBadCommandLines) {
+    const std::vector<std::pair<std::vector<std::string>, std::string>> cases = {
+        {{"top", "inner", "gte"}, "tool: Unknown command or namespace 'gte' in 'top inner'. Did you mean 'get'?\n"},
+        {{"tpo"}, "tool: Unknown command or namespace 'tpo'. Did you mean 'top'?\n"},
+        {{"top", "--bogus"}, "tool: Unknown option --bogus for 'top'\n"},
+        {{"--formatter=jsno", "top", "list", "-n", "alpha"},
+         "tool: Unknown formatter 'jsno'. Did you mean 'json'? Formatters: simple, table, json, xml, csv, keyvalue\n"},
+        {{"top", "list", "-n", "alpha", "--formatter"},
+         "tool: Option --formatter needs a value: one of simple, table, json, xml, csv, keyvalue\n"},
+        {{"top", "list", "-n", "gamma"},
+         "tool: Invalid value 'gamma' for --name: it must be one of alpha, beta\n"
+         "Run 'tool top list --help' for its options.\n"},
+    };
+    for (const auto& c : cases) {
+        Outcome o = RunLine(c.first);
+        EXPECT_EQ(o.status, AutoCli::kExitUsage) << c.second;
+        EXPECT_EQ(o.err, c.second);
+        EXPECT_EQ(o.out, "");
+    }
+    // A namespace without a command: its help on stderr, usage status.
+    Outcome o = RunLine({"top", "inner"});
+    EXPECT_EQ(o.status, AutoCli::kExitUsage);
+    EXPECT_EQ(o.err.substr(0, 58), "tool: 'top inner' is a namespace; give one of its commands");
+    EXPECT_NE(o.err.find("Available Commands:"), std::string::npos);
+}
+
+TEST(Runner, HelpAtEveryLevel) {
+    Outcome root = RunLine({"--help"});
+    EXPECT_EQ(root.status, 0);
+    EXPECT_EQ(root.out,
+              "Usage: tool [options] {namespace|cmd} [cmd options]\n"
+              "\n"
+              "Options:\n"
+              "  --formatter=<str>   Override the output formatter: simple, table, json, xml, csv, keyvalue.\n"
+              "  -h|--help           Show the help of the namespace or command.\n"
+              "  --version           Print the version of the CLI and exit.\n"
+              "\n"
+              "Available Namespaces:\n"
+              "  top  Top things\n"
+              "\n"
+              "For help on a namespace or command: tool <name> --help\n");
+
+    // Children in their order of attachment, namespaces and commands apart.
+    Outcome ns = RunLine({"top", "--help"});
+    EXPECT_EQ(ns.out,
+              "Usage: tool top {namespace|cmd} [cmd options]\n"
+              "\n"
+              "Top things\n"
+              "\n"
+              "Available Namespaces:\n"
+              "  inner  Inner things\n"
+              "\n"
+              "Available Commands:\n"
+              "  list  Do a fake thing\n"
+              "\n"
+              "For help on a namespace or command: tool top <name> --help\n");
+
+    // Help wins over missing required options.
+    Outcome cmd = RunLine({"top", "inner", "get", "-h"});
+    EXPECT_EQ(cmd.status, 0);
+    EXPECT_EQ(cmd.out,
+              "Usage: tool top inner get [cmd options]\n"
+              "\n"
+              "Description:\n"
+              "  Do a fake thing\n"
+              "\n"
+              "Cmd options:\n"
+              "  -n|--name=<str>  (required)\n"
+              "      The name. One of: alpha, beta. In full: \n"
+              "        alpha: The first one\n"
+              "        beta\n"
+              "  -f|--force\n"
+              "      Force it\n");
+
+    EXPECT_EQ(RunLine({"--version"}).out, "tool 9.9\n");
+}
+
+}  // namespace
