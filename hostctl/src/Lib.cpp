@@ -3,14 +3,17 @@
 namespace HostCtl {
 namespace Lib {
 
-HostCtlException::HostCtlException(const std::string& message, const VobMessage& vob)
-    : message_(message), vob_(vob) {}
+HostCtlException::HostCtlException(const std::string& message, const VobMessage& vob) : message_(message), vob_(vob) {}
 
 HostCtlException::~HostCtlException() = default;
 
-std::string HostCtlException::GetMessage(int index) const { return index == 0 ? message_ : std::string(); }
+std::string HostCtlException::GetMessage(int index) const {
+    return index == 0 ? message_ : std::string();
+}
 
-const char* HostCtlException::what() const noexcept { return message_.c_str(); }
+const char* HostCtlException::what() const noexcept {
+    return message_.c_str();
+}
 
 }  // namespace Lib
 }  // namespace HostCtl

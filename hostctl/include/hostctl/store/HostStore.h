@@ -73,6 +73,13 @@ void ValidateProfile(const Json& profile);
 // The key an object has in its collection; throws ProfileError when a key
 // field is missing or not a string or integer.
 std::string KeyOf(const CollectionInfo& collection, const Json& object);
+// The text of a profile file (a regular file of bounded size); throws
+// ProfileError naming the file when it cannot be read.
+std::string ReadProfileFile(const std::string& file);
+// A profile as text, indented by two blanks, with its sections in a reader's
+// order: format, version, the singletons, then the collections (each in the
+// order of Singletons() and Collections()).
+std::string FormatProfile(const Json& profile);
 
 // An injected fault: an operation named "Class::Operation" throws
 // HostCtlException with this message; with a key, only for that object.
@@ -122,6 +129,9 @@ public:
     // $ORVIX_HOST_PROFILE, else the embedded default. Throws StoreError
     // when that file cannot be read.
     static std::string ResolveProfileText();
+    // Where ResolveProfileText() takes the profile from, for messages and the
+    // store's record of its origin: the file name, or "(embedded default)".
+    static std::string ResolveProfileOrigin();
 
     // The process-wide store at ResolvePath(), opened on first use and created
     // from ResolveProfileText() when the file does not exist. Throws StoreError.
@@ -141,6 +151,11 @@ public:
     // Creates a new store from a profile; throws StoreError when the file
     // exists already.
     static std::unique_ptr<HostStore> Create(const std::string& path, const std::string& profileText);
+    // The same two from a profile that ParseProfile already read; origin says
+    // where it came from and is kept in the store (meta table).
+    static std::unique_ptr<HostStore> OpenOrCreate(const std::string& path, const Json& profile,
+                                                   const std::string& origin);
+    static std::unique_ptr<HostStore> Create(const std::string& path, const Json& profile, const std::string& origin);
 
     ~HostStore();
     HostStore(const HostStore&) = delete;
@@ -178,6 +193,11 @@ private:
     friend class Transaction;
     struct Impl;
     explicit HostStore(const std::string& path);
+    // Builds a complete store in a temporary file beside path and links it
+    // to path. When path appeared meanwhile, opens that one (openIfExists) or
+    // throws StoreError.
+    static std::unique_ptr<HostStore> Build(const std::string& path, const Json& profile, const std::string& origin,
+                                            bool openIfExists);
     std::string path_;
     std::unique_ptr<Impl> impl_;
 };

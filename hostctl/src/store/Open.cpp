@@ -1,0 +1,247 @@
+// Opening and creating store files. Opening checks the file before anything
+// is written to it, so a damaged or foreign file is left exactly as it was.
+// Creating builds the whole database under a temporary name and links it
+// into place, so the final name never shows a half-built store.
+#include <fcntl.h>
+#include <sys/stat.h>
+#include <unistd.h>
+
+#include <cerrno>
+#include <cstring>
+#include <ctime>
+#include <vector>
+
+#include "StoreImpl.h"
+
+namespace PldCtl {
+namespace Store {
+
+namespace {
+
+constexpr std::int64_t kApplicationId = 0x4F525658;  // "ORVX"
+
+std::string Damaged(const std::string& path) {
+    return Sql::Describe(path, "is not an SQLite database or is damaged");
+}
+
+std::string SystemError(const std::string& path, const std::string& what) {
+    return Sql::Describe(path, what + ": " + std::strerror(errno));
+}
+
+// The size of a file, or -1 when it cannot be seen.
+off_t FileSize(const std::string& path) {
+    struct stat st {};
+    return stat(path.c_str(), &st) == 0 ? st.st_size : -1;
+}
+
+std::string ParentDirectory(const std::string& path) {
+    const auto slash = path.rfind('/');
+    if (slash == std::string::npos) return ".";
+    return slash == 0 ? "/" : path.substr(0, slash);
+}
+
+// Like mkdir -p, but private: the store is one user's host.
+void MakeParentDirectories(const std::string& path) {
+    const std::string parent = ParentDirectory(path);
+    for (auto end = parent.find('/', 1);; end = parent.find('/', end + 1)) {
+        const std::string prefix = parent.substr(0, end);
+        if (mkdir(prefix.c_str(), 0700) != 0 && errno != EEXIST) {
+            throw StoreError(SystemError(path, "cannot be created: directory '" + prefix + "'"));
+        }
+        if (end == std::string::npos) break;
+    }
+}
+
+// Makes a link just made survive a power loss.
+void SyncDirectory(const std::string& directory) {
+    int fd = open(directory.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC);
+    if (fd < 0) return;
+    fsync(fd);
+    close(fd);
+}
+
+// A uniquely named empty file beside the store; it and any SQLite side file
+// are removed when it goes out of scope, after linking as after a failure.
+class TemporaryFile {
+public:
+    explicit TemporaryFile(const std::string& path) {
+        std::vector<char> name(path.begin(), path.end());
+        const std::string pattern = ".tmp-XXXXXX";
+        name.insert(name.end(), pattern.begin(), pattern.end());
+        name.push_back('\0');
+        int fd = mkstemp(name.data());
+        if (fd < 0) throw StoreError(SystemError(path, "cannot be created"));
+        close(fd);
+        name_ = name.data();
+    }
+    ~TemporaryFile() {
+        for (const char* suffix : {"", "-journal", "-wal", "-shm"}) unlink((name_ + suffix).c_str());
+    }
+    TemporaryFile(const TemporaryFile&) = delete;
+    TemporaryFile& operator=(const TemporaryFile&) = delete;
+
+    const std::string& Name() const { return name_; }
+
+private:
+    std::string name_;
+};
+
+std::string SchemaSql() {
+    std::string sql = "PRAGMA application_id = " + std::to_string(kApplicationId) + ";";
+    sql += "PRAGMA user_version = " + std::to_string(kSchemaVersion) + ";";
+    sql += "CREATE TABLE meta(name TEXT PRIMARY KEY, value TEXT NOT NULL);";
+    sql += "CREATE TABLE singleton(name TEXT PRIMARY KEY, doc TEXT NOT NULL);";
+    sql +=
+        "CREATE TABLE fault(id INTEGER PRIMARY KEY AUTOINCREMENT, operation TEXT NOT NULL, key TEXT NOT NULL DEFAULT '', "
+        "message TEXT NOT NULL, remaining INTEGER NULL);";
+    sql += "CREATE INDEX fault_operation ON fault(operation);";
+    for (const auto& collection : Collections()) {
+        const std::string table = collection.section;
+        sql += TableSql(table,
+                        "CREATE TABLE %T(key TEXT PRIMARY KEY, parent TEXT, seq INTEGER NOT NULL, doc TEXT NOT NULL);");
+        sql += "CREATE INDEX " + Sql::Quote(table + "_parent") + " ON " + Sql::Quote(table) + "(parent, seq);";
+        sql += "CREATE INDEX " + Sql::Quote(table + "_seq") + " ON " + Sql::Quote(table) + "(seq);";
+    }
+    return sql;
+}
+
+std::string UtcNow() {
+    const std::time_t now = std::time(nullptr);
+    std::tm utc{};
+    gmtime_r(&now, &utc);
+    char text[32];
+    std::strftime(text, sizeof text, "%Y-%m-%dT%H:%M:%SZ", &utc);
+    return text;
+}
+
+// Per connection, not stored in the file: every commit reaches the disk
+// before Change() returns.
+void Configure(Sql::Database& db) {
+    db.Exec("PRAGMA synchronous = FULL");
+}
+
+// Brings a store of an older schema up to date. Schema 1 is the first, so
+// only a file that never got a schema version can be older; the next schema
+// change adds its upgrade step here.
+void Migrate(const Sql::Database& db, std::int64_t version) {
+    if (version < 1) throw StoreError(Sql::Describe(db.Path(), "has no schema version; it is damaged"));
+}
+
+// Everything that can be learnt about the file without writing to it.
+void Verify(Sql::Database& db, off_t size) {
+    const std::string& path = db.Path();
+    std::int64_t applicationId = 0;
+    try {
+        applicationId = db.Integer("PRAGMA application_id");
+    } catch (const Sql::BusyError&) {
+        throw;
+    } catch (const StoreError&) {
+        throw StoreError(Damaged(path));
+    }
+    if (applicationId != kApplicationId) {
+        throw StoreError(Sql::Describe(path, "is an SQLite database of another application, not a host store"));
+    }
+    const std::int64_t version = db.Integer("PRAGMA user_version");
+    if (version > kSchemaVersion) {
+        throw StoreError(Sql::Describe(path, "was written by a newer version (schema " + std::to_string(version) +
+                                                 ", this build reads up to " + std::to_string(kSchemaVersion) + ")"));
+    }
+    // Pages that live only in the write-ahead log make the file legitimately
+    // shorter than the database; without one, a short file lost its end.
+    if (FileSize(path + "-wal") <= 0) {
+        const std::int64_t expected = db.Integer("PRAGMA page_count") * db.Integer("PRAGMA page_size");
+        if (size < expected) {
+            throw StoreError(Sql::Describe(
+                path, "is truncated (" + std::to_string(size) + " bytes of " + std::to_string(expected) + ")"));
+        }
+    }
+    if (version < kSchemaVersion) Migrate(db, version);
+}
+
+}  // namespace
+
+bool PathExists(const std::string& path) {
+    struct stat st {};
+    return lstat(path.c_str(), &st) == 0;
+}
+
+std::unique_ptr<HostStore> HostStore::Open(const std::string& path) {
+    struct stat st {};
+    if (stat(path.c_str(), &st) != 0) {
+        throw StoreError(errno == ENOENT ? Sql::Describe(path, "does not exist")
+                                         : SystemError(path, "cannot be opened"));
+    }
+    if (!S_ISREG(st.st_mode)) throw StoreError(Sql::Describe(path, "is not a regular file"));
+    // SQLite takes an empty file for a new database and would write one in it.
+    if (st.st_size == 0) throw StoreError(Damaged(path));
+    std::unique_ptr<HostStore> store(new HostStore(path));
+    Verify(store->impl_->db, st.st_size);
+    Configure(store->impl_->db);
+    return store;
+}
+
+std::unique_ptr<HostStore> HostStore::Build(const std::string& path, const Json& profile, const std::string& origin,
+                                            bool openIfExists) {
+    ValidateProfile(profile);
+    MakeParentDirectories(path);
+    TemporaryFile temporary(path);
+    {
+        HostStore building(temporary.Name());
+        Sql::Database& db = building.impl_->db;
+        Configure(db);
+        db.Exec("BEGIN");
+        db.Exec(SchemaSql());
+        db.Prepare("INSERT INTO meta(name, value) VALUES ('created', ?1), ('profile', ?2)")
+            .Bind(1, UtcNow())
+            .Bind(2, origin)
+            .Run();
+        db.Exec("COMMIT");
+        building.Load(profile);
+        // The journal mode is kept in the file. Closing the connection right
+        // after switching leaves an empty log, which SQLite removes, so the
+        // file alone holds the whole store when it is linked.
+        db.Exec("PRAGMA journal_mode = WAL");
+    }
+    if (link(temporary.Name().c_str(), path.c_str()) != 0) {
+        // Another process created the store first; its file is complete,
+        // since it too was linked only once built.
+        if (errno == EEXIST && openIfExists) return Open(path);
+        throw StoreError(errno == EEXIST ? Sql::Describe(path, "exists already")
+                                         : SystemError(path, "cannot be created"));
+    }
+    SyncDirectory(ParentDirectory(path));
+    return Open(path);
+}
+
+std::unique_ptr<HostStore> HostStore::Create(const std::string& path, const Json& profile, const std::string& origin) {
+    if (PathExists(path)) throw StoreError(Sql::Describe(path, "exists already"));
+    return Build(path, profile, origin, false);
+}
+
+std::unique_ptr<HostStore> HostStore::OpenOrCreate(const std::string& path, const Json& profile,
+                                                   const std::string& origin) {
+    return PathExists(path) ? Open(path) : Build(path, profile, origin, true);
+}
+
+namespace {
+
+// What a profile given as text is called in messages and in the store.
+std::string TextOrigin(const std::string& path) {
+    return "given for '" + path + "'";
+}
+
+}  // namespace
+
+std::unique_ptr<HostStore> HostStore::Create(const std::string& path, const std::string& profileText) {
+    const std::string origin = TextOrigin(path);
+    return Create(path, ParseProfile(profileText, origin), origin);
+}
+
+std::unique_ptr<HostStore> HostStore::OpenOrCreate(const std::string& path, const std::string& profileText) {
+    if (PathExists(path)) return Open(path);
+    const std::string origin = TextOrigin(path);
+    return Build(path, ParseProfile(profileText, origin), origin, true);
+}
+
+}  // namespace Store
+}  // namespace PldCtl
