@@ -6,7 +6,7 @@ set -euo pipefail
 
 packages=(
   build-essential cmake ninja-build pkg-config
-  libboost-dev libboost-regex-dev
+  libboost-dev
   libsqlite3-dev nlohmann-json3-dev
   libgtest-dev libgmock-dev
 )

@@ -1,1 +1,392 @@
-// placeholder
+// The plug-in's entry point: builds the network command tree and attaches it
+// to the host CLI's node.
+//
+// Each block below is one namespace with its children in their order of
+// attachment; a leaf whose command is not written yet is noted in its place
+// ("// word: Class"), so adding a command means replacing its note with the
+// RegisterNamespaceNode line. The root is attached to the host CLI's node
+// only at the very end: if anything throws before, the host CLI's node is
+// left untouched and no partial tree is ever visible.
+#include <boost/shared_ptr.hpp>
+
+#include "IpGet.h"
+#include "IpSet.h"
+#include "framework/AutoCli.h"
+
+namespace {
+
+boost::shared_ptr<AutoCli::Namespace> NewNamespace(const char* description) {
+    boost::shared_ptr<AutoCli::Namespace> node = AutoCli::Namespace::New();
+    node->SetDescription(description);
+    return node;
+}
+
+boost::shared_ptr<AutoCli::Namespace> Attach(const boost::shared_ptr<AutoCli::Namespace>& parent, const char* word,
+                                             const char* description) {
+    boost::shared_ptr<AutoCli::Namespace> node = NewNamespace(description);
+    parent->RegisterNamespaceNode(node, word);
+    return node;
+}
+
+}  // namespace
+
+using namespace OrvixCli::NetworkNamespace;
+
+extern "C" __attribute__((visibility("default"))) void AutoCli_RegisterNamespaces(
+    boost::shared_ptr<AutoCli::Namespace> parent) {
+    auto network = NewNamespace(
+        "Operations that pertain to the maintenance of networking on an Tovrin host. This includes a wide variety of "
+        "commands to manipulate virtual networking components (vswitch, portgroup, etc) as well as local host IP, DNS "
+        "and general host networking settings.");
+
+    // network
+    auto ip = Attach(network, "ip", "Operations that can be performed on pldnics");
+    auto nic = Attach(network, "nic",
+                      "Operations having to do with the configuration of Network Interface Card and getting and "
+                      "updating the NIC settings.");
+    auto sriovnic = Attach(network, "sriovnic",
+                           "Operations having to do with the configuration of SRIOV enabled Network Interface Card and "
+                           "getting and updating the NIC settings.");
+    auto vswitch = Attach(network, "vswitch", "Commands to list and manipulate Virtual Switches on an Tovrin host.");
+    auto firewall = Attach(network, "firewall", "A set of commands for firewall related operations");
+    auto port = Attach(network, "port", "Commands to get information about a port");
+    auto vm = Attach(network, "vm", "A set of commands for VM related operations");
+
+    // network ip
+    ip->RegisterNamespaceNode(IpGet::New(), "get");
+    ip->RegisterNamespaceNode(IpSet::New(), "set");
+    auto ipNeighbor = Attach(ip, "neighbor", "Operations that can be performed on arp tables");
+    auto ipConnection = Attach(ip, "connection", "List active tcpip connections");
+    auto ipDns = Attach(ip, "dns", "Operations pertaining to Domain Name Server configuration.");
+    auto ipRoute = Attach(ip, "route", "Operations pertaining to route configuration");
+    auto ipIpsec = Attach(ip, "ipsec", "Operations on Internet Protocol Security");
+    auto ipInterface = Attach(
+        ip, "interface",
+        "Operations having to do with the creation, management and deletion of Pallad network interfaces (pldnic).");
+    auto ipNetstack =
+        Attach(ip, "netstack",
+               "Operations having to do with the creation, management and deletion of Pallad Netstack Instances.");
+
+    // network ip neighbor
+    // list: IpNeighborList
+    // remove: IpNeighborRemove
+
+    // network ip connection
+    // list: IpConnectionList
+
+    // network ip dns
+    auto ipDnsServer = Attach(ipDns, "server", "Operations pertaining to DNS server configuration.");
+    auto ipDnsSearch = Attach(ipDns, "search", "Operations pertaining to DNS search domain configuration.");
+
+    // network ip dns server
+    // list: IpDNSServerList
+    // add: IpDNSServerAdd
+    // remove: IpDNSServerRemove
+
+    // network ip dns search
+    // add: IpDNSSearchAdd
+    // remove: IpDNSSearchRemove
+    // list: IpDNSSearchList
+
+    // network ip route
+    auto ipRouteIpv4 = Attach(ipRoute, "ipv4", "IPv4 route operations");
+    auto ipRouteIpv6 = Attach(ipRoute, "ipv6", "IPv6 route operations");
+
+    // network ip route ipv4
+    // add: IpRouteIpv4Add
+    // remove: IpRouteIpv4Remove
+    // list: IpRouteIpv4List
+
+    // network ip route ipv6
+    // add: IpRouteIpv6Add
+    // remove: IpRouteIpv6Remove
+    // list: IpRouteIpv6List
+
+    // network ip ipsec
+    // set: IpIpsecSet
+    auto ipIpsecSa = Attach(ipIpsec, "sa", "Operations pertaining to Security Association");
+    auto ipIpsecSp = Attach(ipIpsec, "sp", "Operations pertaining to Security Policy");
+
+    // network ip ipsec sa
+    // add: IpIpsecSAAdd
+    // remove: IpIpsecSARemove
+    // list: IpIpsecSAList
+
+    // network ip ipsec sp
+    // add: IpIpsecSPAdd
+    // remove: IpIpsecSPRemove
+    // list: IpIpsecSPList
+
+    // network ip interface
+    // add: IpInterfaceAdd
+    // remove: IpInterfaceRemove
+    // list: IpInterfaceList
+    // set: IpInterfaceSet
+    auto ipInterfaceIpv4 = Attach(ipInterface, "ipv4", "Commands to get and set IPv4 settings for pldnic.");
+    auto ipInterfaceIpv6 = Attach(ipInterface, "ipv6", "Commands to get and set IPv6 settings for pldnic.");
+    auto ipInterfaceTag = Attach(ipInterface, "tag", "Commands to add and remove tags on pldnics.");
+
+    // network ip interface ipv4
+    // get: IpInterfaceIpv4Get
+    // set: IpInterfaceIpv4Set
+
+    // network ip interface ipv6
+    // set: IpInterfaceIpv6Set
+    // get: IpInterfaceIpv6Get
+    auto ipInterfaceIpv6Address =
+        Attach(ipInterfaceIpv6, "address", "Commands to list and update IPv6 addresses assigned to the system.");
+
+    // network ip interface ipv6 address
+    // list: IpInterfaceIpv6AddressList
+    // add: IpInterfaceIpv6AddressAdd
+    // remove: IpInterfaceIpv6AddressRemove
+
+    // network ip interface tag
+    // add: IpInterfaceTagAdd
+    // remove: IpInterfaceTagRemove
+    // get: IpInterfaceTagGet
+
+    // network ip netstack
+    // list: IpNetstackInstanceList
+    // add: IpNetstackInstanceAdd
+    // remove: IpNetstackInstanceRemove
+    // get: IpNetstackInstanceGet
+    // set: IpNetstackInstanceSet
+
+    // network nic
+    // list: NicList
+    // up: NicUp
+    // get: NicGet
+    // set: NicSet
+    // down: NicDown
+    auto nicStats = Attach(nic, "stats", "Get packet statistics for a NIC");
+    auto nicVlan = Attach(nic, "vlan", "Get VLAN information for a NIC");
+    auto nicCoalesce = Attach(nic, "coalesce", "Commands to access coalesce paramaters for a NIC");
+    auto nicCso = Attach(nic, "cso", "Commands to access checksum offload settings for a NIC");
+    auto nicTso = Attach(nic, "tso", "Commands to access TCP segmentation offload settings for a NIC");
+    auto nicSg = Attach(nic, "sg", "Commands to access scatter-gather settings for a NIC");
+    auto nicPauseParams = Attach(nic, "pauseParams", "Commands to access pause parameters for a NIC");
+    auto nicRegister = Attach(nic, "register", "Commands to access registers for a NIC");
+    auto nicEeprom = Attach(nic, "eeprom", "Commands to access EEPROM for a NIC");
+    auto nicNegotiate = Attach(nic, "negotiate", "Commands to access negotiation feature on a NIC");
+    auto nicSelftest = Attach(nic, "selftest", "Commands to access self test feature on a NIC");
+    auto nicSoftware = Attach(nic, "software", "Commands to access NIC feature software simulation settings");
+    auto nicRing = Attach(nic, "ring", "Commands to access NIC RX/TX ring buffer parameters");
+
+    // network nic stats
+    // get: NicStatsGet
+
+    // network nic vlan
+    auto nicVlanStats = Attach(nicVlan, "stats", "Commands to access VLAN statistics for a NIC");
+
+    // network nic vlan stats
+    // get: NicVlanStatsGet
+    // set: NicVlanStatsSet
+
+    // network nic coalesce
+    // get: NicCoalesceGet
+    // set: NicCoalesceSet
+
+    // network nic cso
+    // get: NicCsoGet
+    // set: NicCsoSet
+
+    // network nic tso
+    // get: NicTsoGet
+    // set: NicTsoSet
+
+    // network nic sg
+    // get: NicSgGet
+    // set: NicSgSet
+
+    // network nic pauseParams
+    // list: NicPauseParamsList
+    // set: NicPauseParamsSet
+
+    // network nic register
+    // dump: NicRegisterDump
+
+    // network nic eeprom
+    // dump: NicEepromDump
+    // change: NicEepromChange
+
+    // network nic negotiate
+    // restart: NicNegotiationRestart
+
+    // network nic selftest
+    // run: NicSelfTestRun
+
+    // network nic software
+    // list: NicSoftwareList
+    // set: NicSoftwareSet
+
+    // network nic ring
+    auto nicRingPreset = Attach(nicRing, "preset", "Commands to access preset NIC RX/TX ring buffer parameters");
+    auto nicRingCurrent = Attach(nicRing, "current", "Commands to access current NIC RX/TX ring buffer parameters");
+
+    // network nic ring preset
+    // get: NicRingPresetGet
+
+    // network nic ring current
+    // get: NicRingCurrentGet
+    // set: NicRingCurrentSet
+
+    // network sriovnic
+    // list: SriovNicList
+    auto sriovnicVf = Attach(sriovnic, "vf", "Operations related to VFs of a SRIOV capable pNIC");
+
+    // network sriovnic vf
+    // list: VfList
+    // stats: VfStats
+
+    // network vswitch
+    auto vswitchStandard =
+        Attach(vswitch, "standard", "Commands to list and manipulate Legacy Virtual Switches on an Tovrin host.");
+    auto vswitchDvs = Attach(vswitch, "dvs", "Commands to retrieve Distributed Virtual Switch information");
+
+    // network vswitch standard
+    // add: VirtualSwitchStandardAdd
+    // set: VirtualSwitchStandardSet
+    // list: VirtualSwitchStandardList
+    // remove: VirtualSwitchStandardRemove
+    auto vswitchStandardUplink =
+        Attach(vswitchStandard, "uplink", "Commands to add and remove uplink on given virtual switch.");
+    auto vswitchStandardPolicy =
+        Attach(vswitchStandard, "policy",
+               "Commands to manipulate network policy settings governing the given virtual switch.");
+    auto vswitchStandardPortgroup =
+        Attach(vswitchStandard, "portgroup", "Commands to list and manipulate Port Groups on an Tovrin host.");
+
+    // network vswitch standard uplink
+    // add: VirtualSwitchStandardUplinkAdd
+    // remove: VirtualSwitchStandardUplinkRemove
+
+    // network vswitch standard policy
+    auto vswitchStandardPolicyShaping =
+        Attach(vswitchStandardPolicy, "shaping",
+               "Commands to manipulate shaping policy setting for the given virtual switch.");
+    auto vswitchStandardPolicySecurity =
+        Attach(vswitchStandardPolicy, "security",
+               "Commands to manipulate security policy setting for the given virtual switch.");
+    auto vswitchStandardPolicyFailover =
+        Attach(vswitchStandardPolicy, "failover",
+               "Commands to manipulate failover policy setting for the given virtual switch.");
+
+    // network vswitch standard policy shaping
+    // get: VirtualSwitchStandardPolicyShapingGet
+    // set: VirtualSwitchStandardPolicyShapingSet
+
+    // network vswitch standard policy security
+    // get: VirtualSwitchStandardPolicySecurityGet
+    // set: VirtualSwitchStandardPolicySecuritySet
+
+    // network vswitch standard policy failover
+    // get: VirtualSwitchStandardPolicyFailoverGet
+    // set: VirtualSwitchStandardPolicyFailoverSet
+
+    // network vswitch standard portgroup
+    // list: VirtualSwitchPortGroupList
+    // add: VirtualSwitchPortGroupAdd
+    // remove: VirtualSwitchPortGroupRemove
+    // set: VirtualSwitchPortGroupSet
+    auto vswitchStandardPortgroupPolicy =
+        Attach(vswitchStandardPortgroup, "policy",
+               "Commands to manipulate network policy settings governing the given portgroup.");
+
+    // network vswitch standard portgroup policy
+    auto vswitchStandardPortgroupPolicyShaping =
+        Attach(vswitchStandardPortgroupPolicy, "shaping",
+               "Commands to manipulate shaping policy setting for the given portgroup.");
+    auto vswitchStandardPortgroupPolicyFailover =
+        Attach(vswitchStandardPortgroupPolicy, "failover",
+               "Commands to manipulate failover policy setting for the given portgroup.");
+    auto vswitchStandardPortgroupPolicySecurity =
+        Attach(vswitchStandardPortgroupPolicy, "security",
+               "Commands to manipulate security policy setting for the given portgroup.");
+
+    // network vswitch standard portgroup policy shaping
+    // get: VirtualSwitchPortGroupPolicyShapingGet
+    // set: VirtualSwitchPortGroupPolicyShapingSet
+
+    // network vswitch standard portgroup policy failover
+    // get: VirtualSwitchPortGroupPolicyFailoverGet
+    // set: VirtualSwitchPortGroupPolicyFailoverSet
+
+    // network vswitch standard portgroup policy security
+    // get: VirtualSwitchPortGroupPolicySecurityGet
+    // set: VirtualSwitchPortGroupPolicySecuritySet
+
+    // network vswitch dvs
+    auto vswitchDvsOrvix =
+        Attach(vswitchDvs, "orvix", "Commands to retrieve Orvix Brenvo Distributed Switch information");
+
+    // network vswitch dvs orvix
+    // list: VirtualSwitchDVSOrvixList
+    // lacp: attached last of all, below
+
+    // network firewall
+    // get: FirewallGet
+    // set: FirewallSet
+    // load: FirewallLoad
+    // refresh: FirewallRefresh
+    // unload: FirewallUnload
+    auto firewallRuleset = Attach(firewall, "ruleset", "Commands to list and update firewall ruleset configuration");
+
+    // network firewall ruleset
+    // list: FirewallRulesetList
+    // set: FirewallRulesetSet
+    auto firewallRulesetRule = Attach(firewallRuleset, "rule", "Commands to list rules in the ruleset");
+    auto firewallRulesetAllowedip =
+        Attach(firewallRuleset, "allowedip", "Commands to list and add/remove allowedip on ruleset");
+
+    // network firewall ruleset rule
+    // list: FirewallRulesetRuleList
+
+    // network firewall ruleset allowedip
+    // list: FirewallRulesetAllowedipList
+    // add: FirewallRulesetAllowedipAdd
+    // remove: FirewallRulesetAllowedipRemove
+
+    // network port
+    auto portStats = Attach(port, "stats", "Commands to get port statistics");
+    auto portFilter = Attach(port, "filter", "Commands to get port filter information");
+
+    // network port stats
+    // get: PortStatsGet
+
+    // network port filter
+    auto portFilterStats = Attach(portFilter, "stats", "Commands to get port filter statistics");
+
+    // network port filter stats
+    // get: PortFilterStatsGet
+
+    // network vm
+    // list: VMList
+    auto vmPort = Attach(vm, "port", "Command to list ports of a given VM");
+
+    // network vm port
+    // list: VMPortList
+
+    // The LACP subtree comes after every other subtree, so "lacp" follows "list"
+    // under network vswitch dvs orvix.
+    auto vswitchDvsOrvixLacp = Attach(vswitchDvsOrvix, "lacp", "A set of commands for LACP related operations");
+    // network vswitch dvs orvix lacp
+    auto vswitchDvsOrvixLacpConfig = Attach(vswitchDvsOrvixLacp, "config", "Command to get LACP configuration");
+    auto vswitchDvsOrvixLacpStatus = Attach(vswitchDvsOrvixLacp, "status", "Command to get LACP port status");
+    auto vswitchDvsOrvixLacpStats = Attach(vswitchDvsOrvixLacp, "stats", "Command to get LACP protocol statistics");
+    auto vswitchDvsOrvixLacpTimeout = Attach(vswitchDvsOrvixLacp, "timeout", "Command to set LACP LAG timeout");
+
+    // network vswitch dvs orvix lacp config
+    // get: LacpGetConfig
+
+    // network vswitch dvs orvix lacp status
+    // get: LacpGetStatus
+
+    // network vswitch dvs orvix lacp stats
+    // get: LacpGetStats
+
+    // network vswitch dvs orvix lacp timeout
+    // set: LacpSetTimeout
+
+    parent->RegisterNamespaceNode(network, "network");
+}
