@@ -1,6 +1,8 @@
 #include "hostctl/network/NetworkInfoImpl.h"
 
 #include "../Operation.h"
+#include "Document.h"
+#include "hostctl/network/SwitchImpl.h"
 
 namespace PldCtl {
 namespace Network {
@@ -22,6 +24,27 @@ void NetworkInfoImpl::SetPldIpv6Enabled(bool enabled) {
         system["ipv6Enabled"] = enabled;
         t.PutSingleton("system", system);
     });
+}
+
+std::vector<std::unique_ptr<HostCtl::Network::Pnic>> NetworkInfoImpl::GetPnics() {
+    Store::HostStore& store = Detail::EnterOperation("NetworkInfoImpl::GetPnics");
+    std::vector<std::unique_ptr<HostCtl::Network::Pnic>> pnics;
+    for (const Json& nic : store.List("nics")) pnics.push_back(std::make_unique<PnicImpl>(nic.value("name", "")));
+    return pnics;
+}
+
+std::vector<std::unique_ptr<HostCtl::Network::PortGroup>> NetworkInfoImpl::GetAllPortGroups() {
+    Store::HostStore& store = Detail::EnterOperation("NetworkInfoImpl::GetAllPortGroups");
+    std::vector<std::unique_ptr<HostCtl::Network::PortGroup>> portGroups;
+    store.Read([&](Store::Transaction& t) {
+        // Switch by switch, each switch's port groups in their order.
+        for (const Json& vswitch : t.List("vswitches")) {
+            for (Json& portGroup : t.ListChildren("portgroups", vswitch.value("name", ""))) {
+                portGroups.push_back(std::make_unique<PortGroupImpl>(Detail::MakeDocument(std::move(portGroup))));
+            }
+        }
+    });
+    return portGroups;
 }
 
 }  // namespace Network

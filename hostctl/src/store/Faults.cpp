@@ -29,13 +29,18 @@ bool IsOperationName(const std::string& operation) {
 
 void HostStore::CheckFault(const std::string& operation, const std::string& key) {
     impl_->RequireIdle();
+    if (impl_->noFaults) return;
     auto& db = impl_->db;
+    if (db.Integer("SELECT NOT EXISTS (SELECT 1 FROM fault)") != 0) {
+        impl_->noFaults = true;
+        return;
+    }
     std::int64_t id = 0;
     std::string message;
     bool counted = false;
     {
-        // The fault table is read on every call, never cached: another
-        // process may have armed or used up a fault since.
+        // While there are faults the table is read on every call: another
+        // process may have used one up since.
         auto query = db.Prepare(
             "SELECT id, message, remaining IS NOT NULL FROM fault "
             "WHERE operation = ?1 AND (key = '' OR key = ?2) ORDER BY id LIMIT 1");
@@ -91,6 +96,7 @@ std::int64_t HostStore::AddFault(const Fault& fault) {
             .Run();
         id = impl_->db.LastInsertId();
     });
+    impl_->noFaults = false;
     return id;
 }
 

@@ -124,6 +124,11 @@ Json HostStore::GetSingleton(const std::string& name) {
     return Transaction(*this).GetSingleton(name);
 }
 
+std::int64_t HostStore::CountChildren(const std::string& section, const std::string& parent,
+                                     const std::vector<FieldTest>& tests) {
+    return Transaction(*this).CountChildren(section, parent, tests);
+}
+
 Json HostStore::Dump() {
     Json profile = {{"format", kProfileFormat}, {"version", kProfileVersion}};
     Read([&](Transaction& transaction) {

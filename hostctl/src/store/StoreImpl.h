@@ -31,6 +31,8 @@ struct HostStore::Impl {
 
     Sql::Database db;
     Mode mode = Mode::Idle;
+    // Set once the fault table was found empty; see CheckFault.
+    bool noFaults = false;
 };
 
 // The text of a key or parent field: a string as it is, an integer in

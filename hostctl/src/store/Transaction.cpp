@@ -66,6 +66,42 @@ std::int64_t Transaction::CountChildren(const std::string& section, const std::s
     return query.Int(0);
 }
 
+std::int64_t Transaction::CountChildren(const std::string& section, const std::string& parent,
+                                       const std::vector<FieldTest>& tests) {
+    std::string sql = "SELECT count(*) FROM %T WHERE parent = ?1";
+    int next = 2;
+    for (const auto& test : tests) {
+        const std::string path = "?" + std::to_string(next++);
+        if (test.equals) {
+            // Compared as text, so an integer field matches its decimal form.
+            sql += " AND CAST(json_extract(doc, " + path + ") AS TEXT) = ?" + std::to_string(next++);
+        } else {
+            sql += " AND coalesce(json_extract(doc, " + path + "), '') NOT IN ('', 0)";
+        }
+    }
+    auto query = Statement(store_.impl_->db, section, sql.c_str());
+    query.Bind(1, parent);
+    next = 2;
+    for (const auto& test : tests) {
+        query.Bind(next++, "$.\"" + test.field + "\"");
+        if (test.equals) query.Bind(next++, *test.equals);
+    }
+    query.Next();
+    return query.Int(0);
+}
+
+std::int64_t Transaction::SumField(const std::string& section, const std::string& field, std::int64_t fallback) {
+    auto query = Statement(store_.impl_->db, section, "SELECT coalesce(sum(coalesce(json_extract(doc, ?1), ?2)), 0) FROM %T");
+    query.Bind(1, "$.\"" + field + "\"").Bind(2, fallback).Next();
+    return query.Int(0);
+}
+
+std::int64_t Transaction::MaxIntegerKey(const std::string& section) {
+    auto query = Statement(store_.impl_->db, section, "SELECT coalesce(max(CAST(key AS INTEGER)), 0) FROM %T");
+    query.Next();
+    return query.Int(0);
+}
+
 void Transaction::Put(const std::string& section, const Json& object) {
     const CollectionInfo& collection = Collection(section);
     if (!object.is_object()) throw std::invalid_argument(section + ": an object must be a JSON object");

@@ -1,6 +1,11 @@
 // Host-wide networking information and settings.
 #pragma once
 
+#include <memory>
+#include <vector>
+
+#include "hostctl/network/Network.h"
+
 namespace PldCtl {
 namespace Network {
 
@@ -13,6 +18,11 @@ public:
     // Whether the kernel's IPv6 support is on.
     virtual bool IsPldIpv6Enabled();
     virtual void SetPldIpv6Enabled(bool enabled);
+
+    // The host's physical NICs, in the host's order.
+    virtual std::vector<std::unique_ptr<HostCtl::Network::Pnic>> GetPnics();
+    // Every port group of every standard switch, switch by switch.
+    virtual std::vector<std::unique_ptr<HostCtl::Network::PortGroup>> GetAllPortGroups();
 };
 
 }  // namespace Network

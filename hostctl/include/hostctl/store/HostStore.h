@@ -94,6 +94,15 @@ struct Fault {
 
 class HostStore;
 
+// A test on one top-level field of stored objects, for counting them without
+// reading them: the field's value equals `equals` (a string, or an integer
+// given in decimal), or, without `equals`, the field is present and not "",
+// 0, false or null.
+struct FieldTest {
+    std::string field;
+    std::optional<std::string> equals;
+};
+
 // Reads and writes inside one transaction (see HostStore::Change and Read).
 class Transaction {
 public:
@@ -103,6 +112,14 @@ public:
     std::vector<Json> ListChildren(const std::string& section, const std::string& parent);
     std::int64_t Count(const std::string& section);
     std::int64_t CountChildren(const std::string& section, const std::string& parent);
+    // The children of `parent` that pass every test.
+    std::int64_t CountChildren(const std::string& section, const std::string& parent,
+                               const std::vector<FieldTest>& tests);
+    // The sum of an integer field over the collection, `fallback` standing
+    // in where an object lacks it.
+    std::int64_t SumField(const std::string& section, const std::string& field, std::int64_t fallback);
+    // The largest key of a collection keyed by one integer field (0 when empty).
+    std::int64_t MaxIntegerKey(const std::string& section);
 
     // Writes an object; its key and parent come from its own fields. A new
     // object goes to the end of its collection, an existing one keeps its place.
@@ -168,6 +185,8 @@ public:
     std::vector<Json> List(const std::string& section);
     std::vector<Json> ListChildren(const std::string& section, const std::string& parent);
     Json GetSingleton(const std::string& name);
+    std::int64_t CountChildren(const std::string& section, const std::string& parent,
+                               const std::vector<FieldTest>& tests = {});
 
     // Several reads that see one state of the host.
     void Read(const std::function<void(Transaction&)>& fn);
@@ -183,7 +202,10 @@ public:
 
     // Throws HostCtl::Lib::HostCtlException with the message of the first
     // fault that matches the operation and key (a fault without key matches
-    // every key), using up one firing of a counted fault.
+    // every key), using up one firing of a counted fault. A store without
+    // faults when first asked is taken to stay without (unless this process
+    // adds one), so the check costs nothing on a host nobody tests; a fault
+    // armed by another process meanwhile is seen by processes started later.
     void CheckFault(const std::string& operation, const std::string& key = std::string());
     std::vector<Fault> ListFaults();
     std::int64_t AddFault(const Fault& fault);
