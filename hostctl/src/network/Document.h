@@ -27,11 +27,52 @@ Store::Json SecurityToJson(const HostCtl::Network::PortSecurityPolicy& policy);
 HostCtl::Network::ShapingPolicy ShapingFromJson(const Store::Json& json);
 Store::Json ShapingToJson(const HostCtl::Network::ShapingPolicy& policy);
 
-// The policies a switch's stored object holds, each over the defaults, so a
-// field a hand-written profile left out reads as its default.
-HostCtl::Network::NicTeamingPolicy SwitchTeaming(const Store::Json& vswitch);
-HostCtl::Network::PortSecurityPolicy SwitchSecurity(const Store::Json& vswitch);
-HostCtl::Network::ShapingPolicy SwitchShaping(const Store::Json& vswitch);
+// How each kind of policy is stored: the field of a switch or port group
+// object that holds it, and its conversions.
+template <typename Policy>
+struct StoredPolicy;
+
+template <>
+struct StoredPolicy<HostCtl::Network::NicTeamingPolicy> {
+    static constexpr const char* kField = "teaming";
+    static HostCtl::Network::NicTeamingPolicy FromJson(const Store::Json& j) { return TeamingFromJson(j); }
+    static Store::Json ToJson(const HostCtl::Network::NicTeamingPolicy& p) { return TeamingToJson(p); }
+};
+
+template <>
+struct StoredPolicy<HostCtl::Network::PortSecurityPolicy> {
+    static constexpr const char* kField = "security";
+    static HostCtl::Network::PortSecurityPolicy FromJson(const Store::Json& j) { return SecurityFromJson(j); }
+    static Store::Json ToJson(const HostCtl::Network::PortSecurityPolicy& p) { return SecurityToJson(p); }
+};
+
+template <>
+struct StoredPolicy<HostCtl::Network::ShapingPolicy> {
+    static constexpr const char* kField = "shaping";
+    static HostCtl::Network::ShapingPolicy FromJson(const Store::Json& j) { return ShapingFromJson(j); }
+    static Store::Json ToJson(const HostCtl::Network::ShapingPolicy& p) { return ShapingToJson(p); }
+};
+
+// The policy a stored switch or port group holds itself (for a port group,
+// only the fields it overrides are set).
+template <typename Policy>
+Policy OwnPolicy(const Store::Json& owner) {
+    auto it = owner.find(StoredPolicy<Policy>::kField);
+    return StoredPolicy<Policy>::FromJson(it == owner.end() ? Store::Json::object() : *it);
+}
+
+// A switch's policy, over the defaults, so that a field a hand-written
+// profile left out reads as its default.
+template <typename Policy>
+Policy SwitchPolicy(const Store::Json& vswitch) {
+    return Policy::GetDefaultPolicy().OverlaidWith(OwnPolicy<Policy>(vswitch));
+}
+
+// Writes a policy into a stored switch or port group object.
+template <typename Policy>
+void StorePolicy(Store::Json& owner, const Policy& policy) {
+    owner[StoredPolicy<Policy>::kField] = StoredPolicy<Policy>::ToJson(policy);
+}
 
 // The object's field, or `fallback` when it is absent.
 template <typename T>

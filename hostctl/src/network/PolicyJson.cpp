@@ -98,18 +98,5 @@ Json ShapingToJson(const ShapingPolicy& p) {
     return json;
 }
 
-NicTeamingPolicy SwitchTeaming(const Json& vswitch) {
-    return NicTeamingPolicy::GetDefaultPolicy().OverlaidWith(TeamingFromJson(vswitch.value("teaming", Json::object())));
-}
-
-PortSecurityPolicy SwitchSecurity(const Json& vswitch) {
-    return PortSecurityPolicy::GetDefaultPolicy().OverlaidWith(
-        SecurityFromJson(vswitch.value("security", Json::object())));
-}
-
-ShapingPolicy SwitchShaping(const Json& vswitch) {
-    return ShapingPolicy::GetDefaultPolicy().OverlaidWith(ShapingFromJson(vswitch.value("shaping", Json::object())));
-}
-
 }  // namespace Detail
 }  // namespace PldCtl

@@ -135,6 +135,27 @@ void DropFromOrder(Json& owner, const std::string& nic) {
     }
 }
 
+// A change of a stored switch that lays the set fields of `policy` over the
+// switch's policy of that kind.
+template <typename Policy>
+auto OverlayOnSwitch(const Policy& policy) {
+    return [&policy](Transaction&, Json& vswitch) {
+        Detail::StorePolicy(vswitch, Detail::SwitchPolicy<Policy>(vswitch).OverlaidWith(policy));
+    };
+}
+
+// A port group's policy in force: its switch's with its own fields over it.
+template <typename Policy>
+Policy InForce(const Json& vswitch, const Json& portGroup) {
+    return Detail::SwitchPolicy<Policy>(vswitch).OverlaidWith(Detail::OwnPolicy<Policy>(portGroup));
+}
+
+// Replaces a port group's own policy of that kind.
+template <typename Policy>
+std::shared_ptr<Detail::Document> WriteOwnPolicy(const char* operation, const std::string& name, const Policy& policy) {
+    return ChangePortGroup(operation, name, [&](Transaction&, Json& p) { Detail::StorePolicy(p, policy); });
+}
+
 }  // namespace
 
 // ---------------------------------------------------------------- PortsetImpl
@@ -218,7 +239,7 @@ void VirtualSwitchImpl::SetCDPStatus(int index) {
 }
 
 bool VirtualSwitchImpl::IsBeaconEnabled() const {
-    return Detail::SwitchTeaming(document_->json).GetLinkCriteria().IsBeaconChecking();
+    return Detail::SwitchPolicy<NicTeamingPolicy>(document_->json).GetLinkCriteria().IsBeaconChecking();
 }
 
 int VirtualSwitchImpl::GetBeaconInterval() const {
@@ -231,11 +252,12 @@ int VirtualSwitchImpl::GetBeaconThreshold() const {
 
 std::vector<std::string> VirtualSwitchImpl::GetBeaconRequiredBy() const {
     Store::HostStore& store = Detail::EnterOperation("VirtualSwitchImpl::GetBeaconRequiredBy", GetName());
-    const NicTeamingPolicy switchPolicy = Detail::SwitchTeaming(document_->json);
+    const NicTeamingPolicy switchPolicy = Detail::SwitchPolicy<NicTeamingPolicy>(document_->json);
     std::vector<std::string> names;
     for (const Json& portGroup : store.ListChildren("portgroups", GetName())) {
-        const NicTeamingPolicy own = Detail::TeamingFromJson(portGroup.value("teaming", Json::object()));
-        if (switchPolicy.OverlaidWith(own).GetLinkCriteria().IsBeaconChecking()) {
+        if (switchPolicy.OverlaidWith(Detail::OwnPolicy<NicTeamingPolicy>(portGroup))
+                .GetLinkCriteria()
+                .IsBeaconChecking()) {
             names.push_back(portGroup.value("name", ""));
         }
     }
@@ -345,11 +367,11 @@ void VirtualSwitchImpl::RemoveUplink(const std::string& nic, bool removeFromPoli
 }
 
 NicTeamingPolicy VirtualSwitchImpl::GetTeamingPolicy() const {
-    return Detail::SwitchTeaming(document_->json);
+    return Detail::SwitchPolicy<NicTeamingPolicy>(document_->json);
 }
 
 NicTeamingPolicy VirtualSwitchImpl::GetConfiguredTeamingPolicy() const {
-    return Detail::SwitchTeaming(document_->json);
+    return Detail::SwitchPolicy<NicTeamingPolicy>(document_->json);
 }
 
 void VirtualSwitchImpl::SetTeamingPolicy(const NicTeamingPolicy& policy) {
@@ -360,29 +382,23 @@ void VirtualSwitchImpl::SetTeamingPolicy(const NicTeamingPolicy& policy) {
         throw HostCtlException("Invalid failover policy for virtual switch " + GetName() +
                                ": an uplink appears more than once in its order");
     }
-    Refresh(ChangeSwitch("VirtualSwitchImpl::SetTeamingPolicy", GetName(), [&](Transaction&, Json& s) {
-        s["teaming"] = Detail::TeamingToJson(Detail::SwitchTeaming(s).OverlaidWith(policy));
-    }));
+    Refresh(ChangeSwitch("VirtualSwitchImpl::SetTeamingPolicy", GetName(), OverlayOnSwitch(policy)));
 }
 
 PortSecurityPolicy VirtualSwitchImpl::GetSecurityPolicy() const {
-    return Detail::SwitchSecurity(document_->json);
+    return Detail::SwitchPolicy<PortSecurityPolicy>(document_->json);
 }
 
 void VirtualSwitchImpl::SetSecurityPolicy(const PortSecurityPolicy& policy) {
-    Refresh(ChangeSwitch("VirtualSwitchImpl::SetSecurityPolicy", GetName(), [&](Transaction&, Json& s) {
-        s["security"] = Detail::SecurityToJson(Detail::SwitchSecurity(s).OverlaidWith(policy));
-    }));
+    Refresh(ChangeSwitch("VirtualSwitchImpl::SetSecurityPolicy", GetName(), OverlayOnSwitch(policy)));
 }
 
 ShapingPolicy VirtualSwitchImpl::GetShapingPolicy() const {
-    return Detail::SwitchShaping(document_->json);
+    return Detail::SwitchPolicy<ShapingPolicy>(document_->json);
 }
 
 void VirtualSwitchImpl::SetShapingPolicy(const ShapingPolicy& policy) {
-    Refresh(ChangeSwitch("VirtualSwitchImpl::SetShapingPolicy", GetName(), [&](Transaction&, Json& s) {
-        s["shaping"] = Detail::ShapingToJson(Detail::SwitchShaping(s).OverlaidWith(policy));
-    }));
+    Refresh(ChangeSwitch("VirtualSwitchImpl::SetShapingPolicy", GetName(), OverlayOnSwitch(policy)));
 }
 
 // -------------------------------------------------------------- PortGroupImpl
@@ -444,42 +460,33 @@ void PortGroupImpl::SetVlanId(long long vlanId) {
 }
 
 NicTeamingPolicy PortGroupImpl::GetTeamingPolicy() const {
-    return Detail::SwitchTeaming(SwitchDocument()->json).OverlaidWith(GetOwnTeamingPolicy());
+    return InForce<NicTeamingPolicy>(SwitchDocument()->json, Stored().json);
 }
-
 NicTeamingPolicy PortGroupImpl::GetOwnTeamingPolicy() const {
-    return Detail::TeamingFromJson(Stored().json.value("teaming", Json::object()));
+    return Detail::OwnPolicy<NicTeamingPolicy>(Stored().json);
 }
-
 void PortGroupImpl::SetOwnTeamingPolicy(const NicTeamingPolicy& policy) {
-    document_ = (ChangePortGroup("PortGroupImpl::SetOwnTeamingPolicy", name_,
-                                 [&](Transaction&, Json& p) { p["teaming"] = Detail::TeamingToJson(policy); }));
+    document_ = WriteOwnPolicy("PortGroupImpl::SetOwnTeamingPolicy", name_, policy);
 }
 
 PortSecurityPolicy PortGroupImpl::GetSecurityPolicy() const {
-    return Detail::SwitchSecurity(SwitchDocument()->json).OverlaidWith(GetOwnSecurityPolicy());
+    return InForce<PortSecurityPolicy>(SwitchDocument()->json, Stored().json);
 }
-
 PortSecurityPolicy PortGroupImpl::GetOwnSecurityPolicy() const {
-    return Detail::SecurityFromJson(Stored().json.value("security", Json::object()));
+    return Detail::OwnPolicy<PortSecurityPolicy>(Stored().json);
 }
-
 void PortGroupImpl::SetOwnSecurityPolicy(const PortSecurityPolicy& policy) {
-    document_ = (ChangePortGroup("PortGroupImpl::SetOwnSecurityPolicy", name_,
-                                 [&](Transaction&, Json& p) { p["security"] = Detail::SecurityToJson(policy); }));
+    document_ = WriteOwnPolicy("PortGroupImpl::SetOwnSecurityPolicy", name_, policy);
 }
 
 ShapingPolicy PortGroupImpl::GetShapingPolicy() const {
-    return Detail::SwitchShaping(SwitchDocument()->json).OverlaidWith(GetOwnShapingPolicy());
+    return InForce<ShapingPolicy>(SwitchDocument()->json, Stored().json);
 }
-
 ShapingPolicy PortGroupImpl::GetOwnShapingPolicy() const {
-    return Detail::ShapingFromJson(Stored().json.value("shaping", Json::object()));
+    return Detail::OwnPolicy<ShapingPolicy>(Stored().json);
 }
-
 void PortGroupImpl::SetOwnShapingPolicy(const ShapingPolicy& policy) {
-    document_ = (ChangePortGroup("PortGroupImpl::SetOwnShapingPolicy", name_,
-                                 [&](Transaction&, Json& p) { p["shaping"] = Detail::ShapingToJson(policy); }));
+    document_ = WriteOwnPolicy("PortGroupImpl::SetOwnShapingPolicy", name_, policy);
 }
 
 // ------------------------------------------------------------------- PnicImpl
