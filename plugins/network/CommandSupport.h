@@ -22,9 +22,9 @@ void DeclareParameter(const boost::shared_ptr<CallSpec::InputSpec>& inputSpec, c
                       const boost::shared_ptr<CallSpec::ParameterConstraint>& constraint =
                           boost::shared_ptr<CallSpec::ParameterConstraint>());
 
-// The output specification of a changing command: one boolean.
+// The output declaration of a changing command: one boolean.
 boost::shared_ptr<CallSpec::OutputSpec> OperationOutputSpec();
-// The output specification whose template is `templ`.
+// The output declaration whose template is `templ`.
 boost::shared_ptr<CallSpec::OutputSpec> OutputSpecOf(const MetaObj::MetaObjectPtr& templ);
 
 // Sets `result` and completes the run.

@@ -11,6 +11,28 @@
 
 #include "IpGet.h"
 #include "IpSet.h"
+#include "VirtualSwitchPortGroupAdd.h"
+#include "VirtualSwitchPortGroupList.h"
+#include "VirtualSwitchPortGroupPolicyFailoverGet.h"
+#include "VirtualSwitchPortGroupPolicyFailoverSet.h"
+#include "VirtualSwitchPortGroupPolicySecurityGet.h"
+#include "VirtualSwitchPortGroupPolicySecuritySet.h"
+#include "VirtualSwitchPortGroupPolicyShapingGet.h"
+#include "VirtualSwitchPortGroupPolicyShapingSet.h"
+#include "VirtualSwitchPortGroupRemove.h"
+#include "VirtualSwitchPortGroupSet.h"
+#include "VirtualSwitchStandardAdd.h"
+#include "VirtualSwitchStandardList.h"
+#include "VirtualSwitchStandardPolicyFailoverGet.h"
+#include "VirtualSwitchStandardPolicyFailoverSet.h"
+#include "VirtualSwitchStandardPolicySecurityGet.h"
+#include "VirtualSwitchStandardPolicySecuritySet.h"
+#include "VirtualSwitchStandardPolicyShapingGet.h"
+#include "VirtualSwitchStandardPolicyShapingSet.h"
+#include "VirtualSwitchStandardRemove.h"
+#include "VirtualSwitchStandardSet.h"
+#include "VirtualSwitchStandardUplinkAdd.h"
+#include "VirtualSwitchStandardUplinkRemove.h"
 #include "framework/AutoCli.h"
 
 namespace {
@@ -245,10 +267,10 @@ extern "C" __attribute__((visibility("default"))) void AutoCli_RegisterNamespace
     auto vswitchDvs = Attach(vswitch, "dvs", "Commands to retrieve Distributed Virtual Switch information");
 
     // network vswitch standard
-    // add: VirtualSwitchStandardAdd
-    // set: VirtualSwitchStandardSet
-    // list: VirtualSwitchStandardList
-    // remove: VirtualSwitchStandardRemove
+    vswitchStandard->RegisterNamespaceNode(VirtualSwitchStandardAdd::New(), "add");
+    vswitchStandard->RegisterNamespaceNode(VirtualSwitchStandardSet::New(), "set");
+    vswitchStandard->RegisterNamespaceNode(VirtualSwitchStandardList::New(), "list");
+    vswitchStandard->RegisterNamespaceNode(VirtualSwitchStandardRemove::New(), "remove");
     auto vswitchStandardUplink =
         Attach(vswitchStandard, "uplink", "Commands to add and remove uplink on given virtual switch.");
     auto vswitchStandardPolicy =
@@ -258,8 +280,8 @@ extern "C" __attribute__((visibility("default"))) void AutoCli_RegisterNamespace
         Attach(vswitchStandard, "portgroup", "Commands to list and manipulate Port Groups on an Tovrin host.");
 
     // network vswitch standard uplink
-    // add: VirtualSwitchStandardUplinkAdd
-    // remove: VirtualSwitchStandardUplinkRemove
+    vswitchStandardUplink->RegisterNamespaceNode(VirtualSwitchStandardUplinkAdd::New(), "add");
+    vswitchStandardUplink->RegisterNamespaceNode(VirtualSwitchStandardUplinkRemove::New(), "remove");
 
     // network vswitch standard policy
     auto vswitchStandardPolicyShaping =
@@ -273,22 +295,22 @@ extern "C" __attribute__((visibility("default"))) void AutoCli_RegisterNamespace
                "Commands to manipulate failover policy setting for the given virtual switch.");
 
     // network vswitch standard policy shaping
-    // get: VirtualSwitchStandardPolicyShapingGet
-    // set: VirtualSwitchStandardPolicyShapingSet
+    vswitchStandardPolicyShaping->RegisterNamespaceNode(VirtualSwitchStandardPolicyShapingGet::New(), "get");
+    vswitchStandardPolicyShaping->RegisterNamespaceNode(VirtualSwitchStandardPolicyShapingSet::New(), "set");
 
     // network vswitch standard policy security
-    // get: VirtualSwitchStandardPolicySecurityGet
-    // set: VirtualSwitchStandardPolicySecuritySet
+    vswitchStandardPolicySecurity->RegisterNamespaceNode(VirtualSwitchStandardPolicySecurityGet::New(), "get");
+    vswitchStandardPolicySecurity->RegisterNamespaceNode(VirtualSwitchStandardPolicySecuritySet::New(), "set");
 
     // network vswitch standard policy failover
-    // get: VirtualSwitchStandardPolicyFailoverGet
-    // set: VirtualSwitchStandardPolicyFailoverSet
+    vswitchStandardPolicyFailover->RegisterNamespaceNode(VirtualSwitchStandardPolicyFailoverGet::New(), "get");
+    vswitchStandardPolicyFailover->RegisterNamespaceNode(VirtualSwitchStandardPolicyFailoverSet::New(), "set");
 
     // network vswitch standard portgroup
-    // list: VirtualSwitchPortGroupList
-    // add: VirtualSwitchPortGroupAdd
-    // remove: VirtualSwitchPortGroupRemove
-    // set: VirtualSwitchPortGroupSet
+    vswitchStandardPortgroup->RegisterNamespaceNode(VirtualSwitchPortGroupList::New(), "list");
+    vswitchStandardPortgroup->RegisterNamespaceNode(VirtualSwitchPortGroupAdd::New(), "add");
+    vswitchStandardPortgroup->RegisterNamespaceNode(VirtualSwitchPortGroupRemove::New(), "remove");
+    vswitchStandardPortgroup->RegisterNamespaceNode(VirtualSwitchPortGroupSet::New(), "set");
     auto vswitchStandardPortgroupPolicy =
         Attach(vswitchStandardPortgroup, "policy",
                "Commands to manipulate network policy settings governing the given portgroup.");
@@ -305,16 +327,20 @@ extern "C" __attribute__((visibility("default"))) void AutoCli_RegisterNamespace
                "Commands to manipulate security policy setting for the given portgroup.");
 
     // network vswitch standard portgroup policy shaping
-    // get: VirtualSwitchPortGroupPolicyShapingGet
-    // set: VirtualSwitchPortGroupPolicyShapingSet
+    vswitchStandardPortgroupPolicyShaping->RegisterNamespaceNode(VirtualSwitchPortGroupPolicyShapingGet::New(), "get");
+    vswitchStandardPortgroupPolicyShaping->RegisterNamespaceNode(VirtualSwitchPortGroupPolicyShapingSet::New(), "set");
 
     // network vswitch standard portgroup policy failover
-    // get: VirtualSwitchPortGroupPolicyFailoverGet
-    // set: VirtualSwitchPortGroupPolicyFailoverSet
+    vswitchStandardPortgroupPolicyFailover->RegisterNamespaceNode(VirtualSwitchPortGroupPolicyFailoverGet::New(),
+                                                                  "get");
+    vswitchStandardPortgroupPolicyFailover->RegisterNamespaceNode(VirtualSwitchPortGroupPolicyFailoverSet::New(),
+                                                                  "set");
 
     // network vswitch standard portgroup policy security
-    // get: VirtualSwitchPortGroupPolicySecurityGet
-    // set: VirtualSwitchPortGroupPolicySecuritySet
+    vswitchStandardPortgroupPolicySecurity->RegisterNamespaceNode(VirtualSwitchPortGroupPolicySecurityGet::New(),
+                                                                  "get");
+    vswitchStandardPortgroupPolicySecurity->RegisterNamespaceNode(VirtualSwitchPortGroupPolicySecuritySet::New(),
+                                                                  "set");
 
     // network vswitch dvs
     auto vswitchDvsOrvix =

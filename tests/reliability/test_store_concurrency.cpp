@@ -67,12 +67,18 @@ TEST(StoreConcurrencyTest, KilledWritersLeaveAWholeStore) {
     const std::string db = dir / "host.db";
     HostStore::Create(db, StoreTest::EmptyProfileText());
     std::mt19937 random(20240611);
-    std::uniform_int_distribution<int> delay(5, 80);
+    std::uniform_int_distribution<int> delay(0, 40);
 
     std::int64_t done = 0;  // changes the store holds
     for (int round = 0; round < kRounds; ++round) {
         SCOPED_TRACE("round " + std::to_string(round));
         Process writer(Bin("store-stress"), {"sequence", db, std::to_string(done + 1)}, dir / "out", dir / "err");
+        // The kill comes at a random moment once the writer is making changes,
+        // however long a (sanitized, loaded) machine takes to start it.
+        const auto giveUp = std::chrono::steady_clock::now() + std::chrono::seconds(30);
+        while (writer.Out().empty() && std::chrono::steady_clock::now() < giveUp) {
+            std::this_thread::sleep_for(std::chrono::milliseconds(1));
+        }
         std::this_thread::sleep_for(std::chrono::milliseconds(delay(random)));
         writer.Kill();
         const int status = writer.Wait();

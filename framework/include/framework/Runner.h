@@ -29,7 +29,7 @@ public:
 };
 
 // Parses a command's arguments (everything after the command path) against
-// its input specification: --long=value, --long value, -s value, -s=value;
+// its declared parameters: --long=value, --long value, -s value, -s=value;
 // flags take no value; bools take true/false, 1/0, yes/no in any case; ints
 // are signed 64-bit decimal. Checks unknown, repeated and missing required
 // options, types and constraints. Throws UsageError with a one-line message.

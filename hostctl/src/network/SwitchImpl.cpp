@@ -145,9 +145,12 @@ auto OverlayOnSwitch(const Policy& policy) {
 }
 
 // A port group's policy in force: its switch's with its own fields over it.
+// A field the switch does not store stays unset here (its getter still
+// answers the default), so a port group can tell a value its switch really
+// has from one nobody gave.
 template <typename Policy>
 Policy InForce(const Json& vswitch, const Json& portGroup) {
-    return Detail::SwitchPolicy<Policy>(vswitch).OverlaidWith(Detail::OwnPolicy<Policy>(portGroup));
+    return Detail::OwnPolicy<Policy>(vswitch).OverlaidWith(Detail::OwnPolicy<Policy>(portGroup));
 }
 
 // Replaces a port group's own policy of that kind.
@@ -560,8 +563,8 @@ std::unique_ptr<VirtualSwitch> VirtualSwitchInfoImpl::AddVirtualSwitchWithPolicy
                                        t.SumField("dvswitches", "numPorts", HostCtl::Network::Portset::DEF_NUM_PORTS);
         if (allocated + numPorts > limit) {
             throw HostCtlException("Unable to create virtual switch " + name + " with " + std::to_string(numPorts) +
-                                   " ports: " + std::to_string(allocated) + " of the host's " + std::to_string(limit) +
-                                   " ports are allocated already");
+                                   (numPorts == 1 ? " port: " : " ports: ") + std::to_string(allocated) +
+                                   " of the host's " + std::to_string(limit) + " ports are allocated already");
         }
         t.Put("vswitches", created);
     });
