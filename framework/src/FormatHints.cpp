@@ -19,17 +19,24 @@ std::optional<std::string> Lookup(const std::map<std::string, std::string>& para
 
 FormatHints::FormatHints(const std::map<std::string, std::string>& parameters) : parameters_(parameters) {}
 
-std::optional<std::vector<std::string>> FormatHints::Fields(const std::string& type) const {
-    std::optional<std::string> value = Lookup(parameters_, "fields:" + type);
-    if (!value) return std::nullopt;
-    return SplitNames(*value);
+const std::optional<std::vector<std::string>>& FormatHints::Fields(const std::string& type) const {
+    auto cached = fields_.find(type);
+    if (cached == fields_.end()) {
+        std::optional<std::string> value = Lookup(parameters_, "fields:" + type);
+        cached = fields_.emplace(type, value ? std::make_optional(SplitNames(*value)) : std::nullopt).first;
+    }
+    return cached->second;
 }
 
-std::optional<std::string> FormatHints::Header(const std::string& type) const {
-    return Lookup(parameters_, "header:" + type);
+const std::optional<std::string>& FormatHints::Header(const std::string& type) const {
+    auto cached = headers_.find(type);
+    if (cached == headers_.end()) cached = headers_.emplace(type, Lookup(parameters_, "header:" + type)).first;
+    return cached->second;
 }
 
-bool FormatHints::HasNoHeader(const std::string& type) const { return Header(type) == std::string(kNoHeader); }
+bool FormatHints::HasNoHeader(const std::string& type) const {
+    return Header(type) == std::string(kNoHeader);
+}
 
 std::optional<std::vector<std::string>> FormatHints::TableColumns(const std::string& type) const {
     // The hint for the type wins over the one for every type, even when it is
@@ -41,7 +48,10 @@ std::optional<std::vector<std::string>> FormatHints::TableColumns(const std::str
 }
 
 std::string FormatHints::Unit(const std::string& type, const std::string& field) const {
-    return Lookup(parameters_, "units:" + type + "." + field).value_or("");
+    const std::string key = type + "." + field;
+    auto cached = units_.find(key);
+    if (cached == units_.end()) cached = units_.emplace(key, Lookup(parameters_, "units:" + key).value_or("")).first;
+    return cached->second;
 }
 
 std::vector<std::string> SplitNames(const std::string& text) {

@@ -26,10 +26,11 @@ public:
     explicit FormatHints(const std::map<std::string, std::string>& parameters);
 
     // The "fields:" list of a record type, or nullopt when none was given.
-    std::optional<std::vector<std::string>> Fields(const std::string& type) const;
+    // Parsed once per type: a list of a thousand records asks a thousand times.
+    const std::optional<std::vector<std::string>>& Fields(const std::string& type) const;
     // The "header:" template, or nullopt when none was given. "<NONE>" is
     // returned as is; HasNoHeader tells it apart.
-    std::optional<std::string> Header(const std::string& type) const;
+    const std::optional<std::string>& Header(const std::string& type) const;
     bool HasNoHeader(const std::string& type) const;
     // Column names for a table of records of this type, or nullopt.
     std::optional<std::vector<std::string>> TableColumns(const std::string& type) const;
@@ -40,6 +41,10 @@ public:
 
 private:
     std::map<std::string, std::string> parameters_;
+    mutable std::map<std::string, std::optional<std::vector<std::string>>> fields_;
+    // "type.field" -> unit, and type -> header, looked up once each.
+    mutable std::map<std::string, std::string> units_;
+    mutable std::map<std::string, std::optional<std::string>> headers_;
 };
 
 // Splits "a,b,c" into its names; an empty text gives no names.

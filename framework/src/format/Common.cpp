@@ -97,7 +97,7 @@ std::vector<MetaStruct::Field> SelectFields(const MetaStruct& record, const Form
     for (const auto& field : record.GetFields()) {
         if (IsPresent(field.second)) present.push_back(field);
     }
-    std::optional<std::vector<std::string>> hinted = hints.Fields(record.GetTypeName());
+    const std::optional<std::vector<std::string>>& hinted = hints.Fields(record.GetTypeName());
     if (!hinted) return present;
 
     std::vector<MetaStruct::Field> chosen;

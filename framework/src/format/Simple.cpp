@@ -45,7 +45,7 @@ private:
 
     void Record(const MetaStruct& record, std::size_t headerIndent, std::size_t fieldIndent) {
         const std::string& type = record.GetTypeName();
-        std::optional<std::string> header = hints_.Header(type);
+        const std::optional<std::string>& header = hints_.Header(type);
         if (header && !hints_.HasNoHeader(type)) {
             out_ << std::string(headerIndent, ' ') << Substitute(*header, record) << '\n';
         }

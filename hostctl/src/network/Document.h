@@ -4,6 +4,7 @@
 
 #include <memory>
 #include <string>
+#include <vector>
 
 #include "hostctl/network/Policy.h"
 #include "hostctl/store/HostStore.h"
@@ -18,6 +19,13 @@ struct Document {
 inline std::shared_ptr<Document> MakeDocument(Store::Json json) {
     return std::make_shared<Document>(Document{std::move(json)});
 }
+
+struct ListedSwitch {
+    std::shared_ptr<Document> document;
+    int configuredPorts = 0;
+    int usedPorts = 0;
+    std::vector<std::shared_ptr<Document>> portGroups;
+};
 
 // A policy object of a switch or port group: a field present is a field set.
 HostCtl::Network::NicTeamingPolicy TeamingFromJson(const Store::Json& json);

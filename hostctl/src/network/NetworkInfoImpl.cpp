@@ -37,11 +37,14 @@ std::vector<std::unique_ptr<HostCtl::Network::PortGroup>> NetworkInfoImpl::GetAl
     Store::HostStore& store = Detail::EnterOperation("NetworkInfoImpl::GetAllPortGroups");
     std::vector<std::unique_ptr<HostCtl::Network::PortGroup>> portGroups;
     store.Read([&](Store::Transaction& t) {
-        // Switch by switch, each switch's port groups in their order.
-        for (const Json& vswitch : t.List("vswitches")) {
-            for (Json& portGroup : t.ListChildren("portgroups", vswitch.value("name", ""))) {
-                portGroups.push_back(std::make_unique<PortGroupImpl>(Detail::MakeDocument(std::move(portGroup))));
-            }
+        // Port group names are unique on the host, so the in-use ports of all
+        // port groups are counted in one pass, by port group name.
+        const auto active = t.CountByField("ports", "portgroup", {Store::FieldTest{"client", std::nullopt}});
+        for (Json& portGroup : t.ListByParentOrder("portgroups")) {
+            auto count = active.find(portGroup.value("name", ""));
+            portGroups.push_back(
+                std::make_unique<PortGroupImpl>(Detail::MakeDocument(std::move(portGroup)),
+                                                count == active.end() ? 0 : static_cast<int>(count->second)));
         }
     });
     return portGroups;

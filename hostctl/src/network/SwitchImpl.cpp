@@ -163,7 +163,8 @@ std::shared_ptr<Detail::Document> WriteOwnPolicy(const char* operation, const st
 
 // ---------------------------------------------------------------- PortsetImpl
 
-PortsetImpl::PortsetImpl(std::shared_ptr<Detail::Document> document) : document_(std::move(document)) {}
+PortsetImpl::PortsetImpl(std::shared_ptr<Detail::Document> document, std::optional<std::pair<int, int>> portCounts)
+    : document_(std::move(document)), portCounts_(portCounts) {}
 
 PortsetImpl::~PortsetImpl() = default;
 
@@ -190,8 +191,8 @@ int PortsetImpl::GetNumPorts() const {
 }
 
 const std::pair<int, int>& PortsetImpl::PortCounts() const {
+    Store::HostStore& store = Detail::EnterOperation("PortsetImpl::GetPortCounts", GetName());
     if (!portCounts_) {
-        Store::HostStore& store = Detail::EnterOperation("PortsetImpl::GetPortCounts", GetName());
         const int configured = static_cast<int>(store.CountChildren("ports", GetName()));
         const int used = static_cast<int>(store.CountChildren("ports", GetName(), {FieldTest{"client", std::nullopt}}));
         portCounts_ = std::make_pair(configured, used);
@@ -214,6 +215,10 @@ std::vector<std::string> PortsetImpl::GetUplinks() const {
 // ---------------------------------------------------------- VirtualSwitchImpl
 
 VirtualSwitchImpl::VirtualSwitchImpl(std::shared_ptr<Detail::Document> document) : PortsetImpl(std::move(document)) {}
+
+VirtualSwitchImpl::VirtualSwitchImpl(const Detail::ListedSwitch& listed)
+    : PortsetImpl(listed.document, std::make_pair(listed.configuredPorts, listed.usedPorts)),
+      portGroups_(listed.portGroups) {}
 
 VirtualSwitchImpl::~VirtualSwitchImpl() = default;
 
@@ -253,25 +258,39 @@ int VirtualSwitchImpl::GetBeaconThreshold() const {
     return Detail::FieldOr<int>(document_->json.value("beacon", Json::object()), "threshold", 3);
 }
 
+const std::vector<std::shared_ptr<Detail::Document>>& VirtualSwitchImpl::PortGroupDocuments() const {
+    if (!portGroups_) {
+        Store::HostStore& store = Store::HostStore::Default();
+        std::vector<std::shared_ptr<Detail::Document>> documents;
+        for (Json& portGroup : store.ListChildren("portgroups", GetName())) {
+            documents.push_back(Detail::MakeDocument(std::move(portGroup)));
+        }
+        portGroups_ = std::move(documents);
+    }
+    return *portGroups_;
+}
+
 std::vector<std::string> VirtualSwitchImpl::GetBeaconRequiredBy() const {
-    Store::HostStore& store = Detail::EnterOperation("VirtualSwitchImpl::GetBeaconRequiredBy", GetName());
+    // Each operation stays a place a fault can be injected, also when a
+    // listing already read what it needs.
+    Detail::EnterOperation("VirtualSwitchImpl::GetBeaconRequiredBy", GetName());
     const NicTeamingPolicy switchPolicy = Detail::SwitchPolicy<NicTeamingPolicy>(document_->json);
     std::vector<std::string> names;
-    for (const Json& portGroup : store.ListChildren("portgroups", GetName())) {
-        if (switchPolicy.OverlaidWith(Detail::OwnPolicy<NicTeamingPolicy>(portGroup))
-                .GetLinkCriteria()
-                .IsBeaconChecking()) {
-            names.push_back(portGroup.value("name", ""));
+    for (const auto& portGroup : PortGroupDocuments()) {
+        const NicTeamingPolicy own = Detail::OwnPolicy<NicTeamingPolicy>(portGroup->json);
+        if (switchPolicy.OverlaidWith(own).GetLinkCriteria().IsBeaconChecking()) {
+            names.push_back(portGroup->json.value("name", ""));
         }
     }
     return names;
 }
 
 std::vector<std::unique_ptr<PortGroup>> VirtualSwitchImpl::GetPortGroups() const {
-    Store::HostStore& store = Detail::EnterOperation("VirtualSwitchImpl::GetPortGroups", GetName());
+    Detail::EnterOperation("VirtualSwitchImpl::GetPortGroups", GetName());
     std::vector<std::unique_ptr<PortGroup>> portGroups;
-    for (Json& portGroup : store.ListChildren("portgroups", GetName())) {
-        portGroups.push_back(std::make_unique<PortGroupImpl>(Detail::MakeDocument(std::move(portGroup))));
+    for (const auto& portGroup : PortGroupDocuments()) {
+        // Each object gets its own copy: callers may change them.
+        portGroups.push_back(std::make_unique<PortGroupImpl>(Detail::MakeDocument(portGroup->json)));
     }
     return portGroups;
 }
@@ -288,6 +307,7 @@ std::unique_ptr<PortGroup> VirtualSwitchImpl::AddPortGroup(const std::string& na
         }
         t.Put("portgroups", created);
     });
+    portGroups_.reset();
     return std::make_unique<PortGroupImpl>(Detail::MakeDocument(created));
 }
 
@@ -308,6 +328,7 @@ void VirtualSwitchImpl::RemovePortGroup(const std::string& name) {
         }
         t.Remove("portgroups", name);
     });
+    portGroups_.reset();
 }
 
 void VirtualSwitchImpl::AddUplink(const std::string& nic) {
@@ -408,8 +429,8 @@ void VirtualSwitchImpl::SetShapingPolicy(const ShapingPolicy& policy) {
 
 PortGroupImpl::PortGroupImpl(const std::string& name) : name_(name) {}
 
-PortGroupImpl::PortGroupImpl(std::shared_ptr<Detail::Document> document)
-    : name_(document->json.value("name", "")), document_(std::move(document)) {}
+PortGroupImpl::PortGroupImpl(std::shared_ptr<Detail::Document> document, std::optional<int> activeClients)
+    : name_(document->json.value("name", "")), document_(std::move(document)), activeClients_(activeClients) {}
 
 PortGroupImpl::~PortGroupImpl() = default;
 
@@ -433,6 +454,7 @@ std::shared_ptr<Detail::Document> PortGroupImpl::SwitchDocument() const {
 
 int PortGroupImpl::GetActiveClients() const {
     Store::HostStore& store = Detail::EnterOperation("PortGroupImpl::GetActiveClients", name_);
+    if (activeClients_) return *activeClients_;
     return static_cast<int>(store.CountChildren("ports", GetVirtualSwitchName(),
                                                 {FieldTest{"portgroup", name_}, FieldTest{"client", std::nullopt}}));
 }
@@ -515,10 +537,29 @@ VirtualSwitchInfoImpl::~VirtualSwitchInfoImpl() = default;
 
 std::vector<std::unique_ptr<VirtualSwitch>> VirtualSwitchInfoImpl::GetVirtualSwitches() {
     Store::HostStore& store = Detail::EnterOperation("VirtualSwitchInfoImpl::GetVirtualSwitches");
+    // One pass over each collection for all switches, instead of a few
+    // queries per switch: listing a thousand switches stays quick.
+    std::vector<Detail::ListedSwitch> listed;
+    store.Read([&](Transaction& t) {
+        const auto configured = t.CountByParent("ports", {});
+        const auto used = t.CountByParent("ports", {FieldTest{"client", std::nullopt}});
+        std::map<std::string, std::vector<std::shared_ptr<Detail::Document>>> portGroups;
+        for (Json& portGroup : t.ListByParentOrder("portgroups")) {
+            const std::string vswitch = portGroup.value("vswitch", "");
+            portGroups[vswitch].push_back(Detail::MakeDocument(std::move(portGroup)));
+        }
+        auto countOf = [](const std::map<std::string, std::int64_t>& counts, const std::string& name) {
+            auto it = counts.find(name);
+            return it == counts.end() ? 0 : static_cast<int>(it->second);
+        };
+        for (Json& vswitch : t.List("vswitches")) {
+            const std::string name = vswitch.value("name", "");
+            listed.push_back(Detail::ListedSwitch{Detail::MakeDocument(std::move(vswitch)), countOf(configured, name),
+                                                  countOf(used, name), std::move(portGroups[name])});
+        }
+    });
     std::vector<std::unique_ptr<VirtualSwitch>> switches;
-    for (Json& vswitch : store.List("vswitches")) {
-        switches.push_back(std::make_unique<VirtualSwitchImpl>(Detail::MakeDocument(std::move(vswitch))));
-    }
+    for (const auto& entry : listed) switches.push_back(std::make_unique<VirtualSwitchImpl>(entry));
     return switches;
 }
 

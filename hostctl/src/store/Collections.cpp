@@ -12,11 +12,11 @@ const std::vector<CollectionInfo>& Collections() {
         // Physical NICs with their driver data, offloads, SR-IOV functions.
         {"nics", {"name"}, nullptr, nullptr},
         // Standard switches with their uplinks and policies.
-        {"vswitches", {"name"}, nullptr, nullptr},
+        {"vswitches", {"name"}, nullptr, nullptr, {"numPorts"}},
         // Port groups of standard switches, each with its own policies.
         {"portgroups", {"name"}, "vswitch", "vswitches"},
         // Distributed switches with their uplinks and LACP data.
-        {"dvswitches", {"name"}, nullptr, nullptr},
+        {"dvswitches", {"name"}, nullptr, nullptr, {"numPorts"}},
         {"dvports", {"dvswitch", "id"}, "dvswitch", "dvswitches"},
         // Network stack instances with their DNS and gateway settings.
         {"netstacks", {"key"}, nullptr, nullptr},
@@ -32,7 +32,7 @@ const std::vector<CollectionInfo>& Collections() {
         {"worlds", {"id"}, nullptr, nullptr},
         // Virtual ports of standard and distributed switches; the owner is the
         // port set (either kind), so it is not checked against one section.
-        {"ports", {"id"}, "portset", nullptr},
+        {"ports", {"id"}, "portset", nullptr, {"client", "portgroup", "type"}},
         {"firewallRulesets", {"name"}, nullptr, nullptr},
         {"ipsecSAs", {"name"}, nullptr, nullptr},
         {"ipsecSPs", {"name"}, nullptr, nullptr},
@@ -40,6 +40,13 @@ const std::vector<CollectionInfo>& Collections() {
         {"execLog", {}, nullptr, nullptr},
     };
     return collections;
+}
+
+std::string ColumnOf(const CollectionInfo& collection, const std::string& field) {
+    for (const char* columnField : collection.columnFields) {
+        if (field == columnField) return "\"f_" + field + "\"";
+    }
+    return std::string();
 }
 
 const CollectionInfo& Collection(const std::string& section) {

@@ -125,7 +125,7 @@ Json HostStore::GetSingleton(const std::string& name) {
 }
 
 std::int64_t HostStore::CountChildren(const std::string& section, const std::string& parent,
-                                     const std::vector<FieldTest>& tests) {
+                                      const std::vector<FieldTest>& tests) {
     return Transaction(*this).CountChildren(section, parent, tests);
 }
 

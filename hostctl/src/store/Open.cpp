@@ -92,13 +92,21 @@ std::string SchemaSql() {
     sql += "CREATE TABLE meta(name TEXT PRIMARY KEY, value TEXT NOT NULL);";
     sql += "CREATE TABLE singleton(name TEXT PRIMARY KEY, doc TEXT NOT NULL);";
     sql +=
-        "CREATE TABLE fault(id INTEGER PRIMARY KEY AUTOINCREMENT, operation TEXT NOT NULL, key TEXT NOT NULL DEFAULT '', "
+        "CREATE TABLE fault(id INTEGER PRIMARY KEY AUTOINCREMENT, operation TEXT NOT NULL, key TEXT NOT NULL DEFAULT "
+        "'', "
         "message TEXT NOT NULL, remaining INTEGER NULL);";
     sql += "CREATE INDEX fault_operation ON fault(operation);";
     for (const auto& collection : Collections()) {
         const std::string table = collection.section;
-        sql += TableSql(table,
-                        "CREATE TABLE %T(key TEXT PRIMARY KEY, parent TEXT, seq INTEGER NOT NULL, doc TEXT NOT NULL);");
+        std::string columns;
+        for (const char* field : collection.columnFields) {
+            columns += ", " + ColumnOf(collection, field) + " GENERATED ALWAYS AS (json_extract(doc, '$.\"" +
+                       std::string(field) + "\"')) STORED";
+        }
+        sql += TableSql(table, ("CREATE TABLE %T(key TEXT PRIMARY KEY, parent TEXT, seq INTEGER NOT NULL, "
+                                "doc TEXT NOT NULL" +
+                                columns + ");")
+                                   .c_str());
         sql += "CREATE INDEX " + Sql::Quote(table + "_parent") + " ON " + Sql::Quote(table) + "(parent, seq);";
         sql += "CREATE INDEX " + Sql::Quote(table + "_seq") + " ON " + Sql::Quote(table) + "(seq);";
     }

@@ -66,33 +66,93 @@ std::int64_t Transaction::CountChildren(const std::string& section, const std::s
     return query.Int(0);
 }
 
-std::int64_t Transaction::CountChildren(const std::string& section, const std::string& parent,
-                                       const std::vector<FieldTest>& tests) {
-    std::string sql = "SELECT count(*) FROM %T WHERE parent = ?1";
-    int next = 2;
+std::string Transaction::Conditions(const CollectionInfo& collection, const std::vector<FieldTest>& tests,
+                                    bool afterParent, std::vector<std::string>& bindings) {
+    // Parameter ?1 is the parent when there is one.
+    const std::size_t first = afterParent ? 2 : 1;
+    std::string sql;
     for (const auto& test : tests) {
-        const std::string path = "?" + std::to_string(next++);
+        std::string value = ColumnOf(collection, test.field);
+        if (value.empty()) {
+            bindings.push_back("$.\"" + test.field + "\"");
+            value = "json_extract(doc, ?" + std::to_string(bindings.size() + first - 1) + ")";
+        }
+        sql += sql.empty() && !afterParent ? " WHERE " : " AND ";
         if (test.equals) {
             // Compared as text, so an integer field matches its decimal form.
-            sql += " AND CAST(json_extract(doc, " + path + ") AS TEXT) = ?" + std::to_string(next++);
+            bindings.push_back(*test.equals);
+            sql += "CAST(" + value + " AS TEXT) = ?" + std::to_string(bindings.size() + first - 1);
         } else {
-            sql += " AND coalesce(json_extract(doc, " + path + "), '') NOT IN ('', 0)";
+            sql += "coalesce(" + value + ", '') NOT IN ('', 0)";
         }
     }
+    return sql;
+}
+
+std::int64_t Transaction::CountChildren(const std::string& section, const std::string& parent,
+                                        const std::vector<FieldTest>& tests) {
+    std::vector<std::string> bindings;
+    const std::string sql =
+        "SELECT count(*) FROM %T WHERE parent = ?1" + Conditions(Collection(section), tests, true, bindings);
     auto query = Statement(store_.impl_->db, section, sql.c_str());
     query.Bind(1, parent);
-    next = 2;
-    for (const auto& test : tests) {
-        query.Bind(next++, "$.\"" + test.field + "\"");
-        if (test.equals) query.Bind(next++, *test.equals);
-    }
+    for (std::size_t i = 0; i < bindings.size(); ++i) query.Bind(static_cast<int>(i + 2), bindings[i]);
     query.Next();
     return query.Int(0);
 }
 
+std::map<std::string, std::int64_t> Transaction::CountBy(const std::string& section, const std::string& groupBy,
+                                                         const std::vector<FieldTest>& tests) {
+    std::vector<std::string> bindings;
+    const std::string sql = "SELECT " + groupBy + ", count(*) FROM %T" +
+                            Conditions(Collection(section), tests, false, bindings) + " GROUP BY 1";
+    auto query = Statement(store_.impl_->db, section, sql.c_str());
+    for (std::size_t i = 0; i < bindings.size(); ++i) query.Bind(static_cast<int>(i + 1), bindings[i]);
+    std::map<std::string, std::int64_t> counts;
+    while (query.Next()) {
+        if (!query.IsNull(0)) counts[query.Text(0)] = query.Int(1);
+    }
+    return counts;
+}
+
+std::map<std::string, std::int64_t> Transaction::CountByParent(const std::string& section,
+                                                               const std::vector<FieldTest>& tests) {
+    return CountBy(section, "parent", tests);
+}
+
+std::map<std::string, std::int64_t> Transaction::CountByField(const std::string& section, const std::string& field,
+                                                              const std::vector<FieldTest>& tests) {
+    std::string value = ColumnOf(Collection(section), field);
+    if (value.empty()) {
+        // Field names come from the library's code, never from users; the
+        // doubled quotes keep any spelling inside the SQL string.
+        std::string escaped;
+        for (char c : field) escaped += c == '\'' ? std::string("''") : std::string(1, c);
+        value = "json_extract(doc, '$.\"" + escaped + "\"')";
+    }
+    return CountBy(section, "CAST(" + value + " AS TEXT)", tests);
+}
+
+std::vector<Json> Transaction::ListByParentOrder(const std::string& section) {
+    const CollectionInfo& collection = Collection(section);
+    if (!collection.parentSection) {
+        throw std::invalid_argument(section + ": its objects have no parent section to be ordered by");
+    }
+    auto& db = store_.impl_->db;
+    const std::string sql = "SELECT c.doc FROM %T AS c JOIN " + Sql::Quote(collection.parentSection) +
+                            " AS p ON p.key = c.parent ORDER BY p.seq, c.seq";
+    auto query = db.Prepare(TableSql(section, sql.c_str()));
+    return Documents(db, query);
+}
+
 std::int64_t Transaction::SumField(const std::string& section, const std::string& field, std::int64_t fallback) {
-    auto query = Statement(store_.impl_->db, section, "SELECT coalesce(sum(coalesce(json_extract(doc, ?1), ?2)), 0) FROM %T");
-    query.Bind(1, "$.\"" + field + "\"").Bind(2, fallback).Next();
+    std::string value = ColumnOf(Collection(section), field);
+    if (value.empty()) value = "json_extract(doc, ?2)";
+    auto query =
+        Statement(store_.impl_->db, section, ("SELECT coalesce(sum(coalesce(" + value + ", ?1)), 0) FROM %T").c_str());
+    query.Bind(1, fallback);
+    if (value[0] != '"') query.Bind(2, "$.\"" + field + "\"");
+    query.Next();
     return query.Int(0);
 }
 

@@ -13,6 +13,8 @@ namespace PldCtl {
 namespace Detail {
 // A stored object of the host, as the library read it.
 struct Document;
+// A switch read while listing all of them, with what the listing read for it.
+struct ListedSwitch;
 }  // namespace Detail
 
 namespace Network {
@@ -33,7 +35,8 @@ public:
     std::vector<std::string> GetUplinks() const override;
 
 protected:
-    explicit PortsetImpl(std::shared_ptr<Detail::Document> document);
+    explicit PortsetImpl(std::shared_ptr<Detail::Document> document,
+                         std::optional<std::pair<int, int>> portCounts = std::nullopt);
     // Takes the stored object as a change left it.
     void Refresh(std::shared_ptr<Detail::Document> document);
     std::shared_ptr<Detail::Document> document_;
@@ -48,6 +51,8 @@ class VirtualSwitchImpl : public PortsetImpl, public virtual HostCtl::Network::V
 public:
     // A snapshot of a stored "vswitches" object.
     explicit VirtualSwitchImpl(std::shared_ptr<Detail::Document> document);
+    // The same, with the port counts and port groups a listing read for it.
+    explicit VirtualSwitchImpl(const Detail::ListedSwitch& listed);
     ~VirtualSwitchImpl() override;
 
     int GetMTU() const override;
@@ -70,6 +75,12 @@ public:
     void SetSecurityPolicy(const HostCtl::Network::PortSecurityPolicy& policy) override;
     HostCtl::Network::ShapingPolicy GetShapingPolicy() const override;
     void SetShapingPolicy(const HostCtl::Network::ShapingPolicy& policy) override;
+
+private:
+    // The switch's port groups as stored, read on first use: listing a switch
+    // asks for them twice (names, and which of them require beaconing).
+    const std::vector<std::shared_ptr<Detail::Document>>& PortGroupDocuments() const;
+    mutable std::optional<std::vector<std::shared_ptr<Detail::Document>>> portGroups_;
 };
 
 // A port group, found by name. Made from a name it never throws; its
@@ -77,8 +88,9 @@ public:
 class PortGroupImpl : public virtual HostCtl::Network::PortGroup {
 public:
     explicit PortGroupImpl(const std::string& name);
-    // A snapshot of a stored "portgroups" object.
-    explicit PortGroupImpl(std::shared_ptr<Detail::Document> document);
+    // A snapshot of a stored "portgroups" object; a listing that counted the
+    // active clients of every port group at once hands the count along.
+    explicit PortGroupImpl(std::shared_ptr<Detail::Document> document, std::optional<int> activeClients = std::nullopt);
     ~PortGroupImpl() override;
 
     // The ports of the port group that are in use by a client.
@@ -106,6 +118,7 @@ private:
     std::shared_ptr<Detail::Document> SwitchDocument() const;
     std::string name_;
     mutable std::shared_ptr<Detail::Document> document_;
+    std::optional<int> activeClients_;
 };
 
 // A physical NIC, found by name.

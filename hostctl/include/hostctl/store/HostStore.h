@@ -13,6 +13,7 @@
 
 #include <cstdint>
 #include <functional>
+#include <map>
 #include <memory>
 #include <optional>
 #include <stdexcept>
@@ -52,9 +53,15 @@ struct CollectionInfo {
     std::vector<const char*> keyFields;
     const char* parentField;    // nullptr: no owner
     const char* parentSection;  // where the owner must exist; nullptr: not checked
+    // Fields the table also keeps in columns of their own, computed when an
+    // object is written, so that counting and summing over them parses no
+    // JSON (CountChildren, SumField).
+    std::vector<const char*> columnFields = {};
 };
 
 const std::vector<CollectionInfo>& Collections();
+// The quoted SQL column holding a column field, or "" for any other field.
+std::string ColumnOf(const CollectionInfo& collection, const std::string& field);
 // Throws std::invalid_argument for an unknown section.
 const CollectionInfo& Collection(const std::string& section);
 // The singleton sections, each one JSON object.
@@ -120,6 +127,15 @@ public:
     std::int64_t SumField(const std::string& section, const std::string& field, std::int64_t fallback);
     // The largest key of a collection keyed by one integer field (0 when empty).
     std::int64_t MaxIntegerKey(const std::string& section);
+    // The objects that pass every test, counted per parent (or per value of
+    // `field`), in one pass over the collection; groups with none are absent.
+    std::map<std::string, std::int64_t> CountByParent(const std::string& section,
+                                                      const std::vector<FieldTest>& tests);
+    std::map<std::string, std::int64_t> CountByField(const std::string& section, const std::string& field,
+                                                     const std::vector<FieldTest>& tests);
+    // Every object of a collection with a parent section, ordered by its
+    // parent's place there, then by its own: all port groups, switch by switch.
+    std::vector<Json> ListByParentOrder(const std::string& section);
 
     // Writes an object; its key and parent come from its own fields. A new
     // object goes to the end of its collection, an existing one keeps its place.
@@ -135,6 +151,12 @@ public:
 private:
     friend class HostStore;
     explicit Transaction(HostStore& store) : store_(store) {}
+    // The WHERE conditions of `tests` (after "WHERE parent = ?1" when
+    // `afterParent`), with the values they bind in order.
+    std::string Conditions(const CollectionInfo& collection, const std::vector<FieldTest>& tests, bool afterParent,
+                           std::vector<std::string>& bindings);
+    std::map<std::string, std::int64_t> CountBy(const std::string& section, const std::string& groupBy,
+                                                const std::vector<FieldTest>& tests);
     HostStore& store_;
 };
 
