@@ -240,6 +240,36 @@ TEST_F(Switches, PortGroupPoliciesOverlayTheirSwitch) {
               "Invalid failover policy for virtual switch vSwitch0: an uplink appears more than once in its order");
 }
 
+TEST_F(Switches, PolicyEditsFromOlderSnapshotsKeepEachOther) {
+    // Two commands read the same policies, each changes one field and writes
+    // back what it read: neither may undo the other.
+    auto first = Switch("vSwitch0");
+    auto second = Switch("vSwitch0");
+    PortSecurityPolicy promiscuous = first->GetSecurityPolicy();
+    promiscuous.SetAllowPromiscuous(true);
+    first->SetSecurityPolicy(promiscuous);
+    PortSecurityPolicy noMacChange = second->GetSecurityPolicy();
+    noMacChange.SetAllowMacAddressChange(false);
+    second->SetSecurityPolicy(noMacChange);
+    PortSecurityPolicy both = Switch("vSwitch0")->GetSecurityPolicy();
+    EXPECT_TRUE(both.GetAllowPromiscuous());
+    EXPECT_FALSE(both.GetAllowMacAddressChange());
+
+    auto pgFirst = NetworkFactory::GetPortGroupByName("Storage");
+    auto pgSecond = NetworkFactory::GetPortGroupByName("Storage");
+    NicTeamingPolicy notify = pgFirst->GetOwnTeamingPolicy();
+    notify.SetNotifySwitchOnFailure(false);
+    pgFirst->SetOwnTeamingPolicy(notify);
+    NicTeamingPolicy inherit = pgSecond->GetOwnTeamingPolicy();
+    inherit.UnsetAll();  // like --use-vswitch: gives back what it had overridden
+    pgSecond->SetOwnTeamingPolicy(inherit);
+    NicTeamingPolicy own = NetworkFactory::GetPortGroupByName("Storage")->GetOwnTeamingPolicy();
+    EXPECT_TRUE(own.IsNotifySwitchOnFailureSet());
+    EXPECT_FALSE(own.GetNotifySwitchOnFailure());
+    EXPECT_FALSE(own.IsTeamingPolicySet());
+    EXPECT_FALSE(own.IsRollingRestorationSet());
+}
+
 TEST_F(Switches, InjectedFaultsReachTheirOperation) {
     HostStore::Default().AddFault({0, "VirtualSwitchImpl::SetMTU", "vSwitch1", "MTU change refused by the driver", 1});
     EXPECT_EQ(Switch("vSwitch0")->GetMTU(), 1500);

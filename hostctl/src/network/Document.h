@@ -76,12 +76,6 @@ Policy SwitchPolicy(const Store::Json& vswitch) {
     return Policy::GetDefaultPolicy().OverlaidWith(OwnPolicy<Policy>(vswitch));
 }
 
-// Writes a policy into a stored switch or port group object.
-template <typename Policy>
-void StorePolicy(Store::Json& owner, const Policy& policy) {
-    owner[StoredPolicy<Policy>::kField] = StoredPolicy<Policy>::ToJson(policy);
-}
-
 // The object's field, or `fallback` when it is absent.
 template <typename T>
 T FieldOr(const Store::Json& object, const char* field, T fallback) {

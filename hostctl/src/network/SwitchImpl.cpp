@@ -135,12 +135,32 @@ void DropFromOrder(Json& owner, const std::string& nic) {
     }
 }
 
-// A change of a stored switch that lays the set fields of `policy` over the
-// switch's policy of that kind.
+// Writes into `stored` the fields in which `edited` differs from `base`, the
+// policy the caller started from (a field only `base` has is removed). A
+// command reads a policy, edits it and writes it back; merging only its own
+// edits into what is stored now keeps the edits of a command that ran in
+// between, instead of writing over them with the old values.
+void MergeEdits(Json& stored, const Json& base, const Json& edited) {
+    if (!stored.is_object()) stored = Json::object();
+    for (auto field = edited.begin(); field != edited.end(); ++field) {
+        auto before = base.find(field.key());
+        if (before == base.end() || *before != field.value()) stored[field.key()] = field.value();
+    }
+    for (auto field = base.begin(); field != base.end(); ++field) {
+        if (!edited.contains(field.key())) stored.erase(field.key());
+    }
+}
+
+// A change of a stored switch that applies the edits `policy` made to the
+// switch's policy of that kind as the snapshot `base` had it.
 template <typename Policy>
-auto OverlayOnSwitch(const Policy& policy) {
-    return [&policy](Transaction&, Json& vswitch) {
-        Detail::StorePolicy(vswitch, Detail::SwitchPolicy<Policy>(vswitch).OverlaidWith(policy));
+auto EditSwitchPolicy(const Json& base, const Policy& policy) {
+    return [&base, &policy](Transaction&, Json& vswitch) {
+        using Stored = Detail::StoredPolicy<Policy>;
+        const Policy before = Detail::SwitchPolicy<Policy>(base);
+        Json merged = Stored::ToJson(Detail::SwitchPolicy<Policy>(vswitch));
+        MergeEdits(merged, Stored::ToJson(before), Stored::ToJson(before.OverlaidWith(policy)));
+        vswitch[Stored::kField] = merged;
     };
 }
 
@@ -153,10 +173,16 @@ Policy InForce(const Json& vswitch, const Json& portGroup) {
     return Detail::OwnPolicy<Policy>(vswitch).OverlaidWith(Detail::OwnPolicy<Policy>(portGroup));
 }
 
-// Replaces a port group's own policy of that kind.
+// Applies to a port group's own policy of that kind the edits `policy` made
+// to it as the snapshot `base` had it.
 template <typename Policy>
-std::shared_ptr<Detail::Document> WriteOwnPolicy(const char* operation, const std::string& name, const Policy& policy) {
-    return ChangePortGroup(operation, name, [&](Transaction&, Json& p) { Detail::StorePolicy(p, policy); });
+std::shared_ptr<Detail::Document> WriteOwnPolicy(const char* operation, const Json& base, const Policy& policy) {
+    using Stored = Detail::StoredPolicy<Policy>;
+    return ChangePortGroup(operation, base.value("name", ""), [&](Transaction&, Json& p) {
+        Json merged = Stored::ToJson(Detail::OwnPolicy<Policy>(p));
+        MergeEdits(merged, Stored::ToJson(Detail::OwnPolicy<Policy>(base)), Stored::ToJson(policy));
+        p[Stored::kField] = merged;
+    });
 }
 
 }  // namespace
@@ -406,7 +432,7 @@ void VirtualSwitchImpl::SetTeamingPolicy(const NicTeamingPolicy& policy) {
         throw HostCtlException("Invalid failover policy for virtual switch " + GetName() +
                                ": an uplink appears more than once in its order");
     }
-    Refresh(ChangeSwitch("VirtualSwitchImpl::SetTeamingPolicy", GetName(), OverlayOnSwitch(policy)));
+    Refresh(ChangeSwitch("VirtualSwitchImpl::SetTeamingPolicy", GetName(), EditSwitchPolicy(document_->json, policy)));
 }
 
 PortSecurityPolicy VirtualSwitchImpl::GetSecurityPolicy() const {
@@ -414,7 +440,7 @@ PortSecurityPolicy VirtualSwitchImpl::GetSecurityPolicy() const {
 }
 
 void VirtualSwitchImpl::SetSecurityPolicy(const PortSecurityPolicy& policy) {
-    Refresh(ChangeSwitch("VirtualSwitchImpl::SetSecurityPolicy", GetName(), OverlayOnSwitch(policy)));
+    Refresh(ChangeSwitch("VirtualSwitchImpl::SetSecurityPolicy", GetName(), EditSwitchPolicy(document_->json, policy)));
 }
 
 ShapingPolicy VirtualSwitchImpl::GetShapingPolicy() const {
@@ -422,7 +448,7 @@ ShapingPolicy VirtualSwitchImpl::GetShapingPolicy() const {
 }
 
 void VirtualSwitchImpl::SetShapingPolicy(const ShapingPolicy& policy) {
-    Refresh(ChangeSwitch("VirtualSwitchImpl::SetShapingPolicy", GetName(), OverlayOnSwitch(policy)));
+    Refresh(ChangeSwitch("VirtualSwitchImpl::SetShapingPolicy", GetName(), EditSwitchPolicy(document_->json, policy)));
 }
 
 // -------------------------------------------------------------- PortGroupImpl
@@ -491,7 +517,7 @@ NicTeamingPolicy PortGroupImpl::GetOwnTeamingPolicy() const {
     return Detail::OwnPolicy<NicTeamingPolicy>(Stored().json);
 }
 void PortGroupImpl::SetOwnTeamingPolicy(const NicTeamingPolicy& policy) {
-    document_ = WriteOwnPolicy("PortGroupImpl::SetOwnTeamingPolicy", name_, policy);
+    document_ = WriteOwnPolicy("PortGroupImpl::SetOwnTeamingPolicy", Stored().json, policy);
 }
 
 PortSecurityPolicy PortGroupImpl::GetSecurityPolicy() const {
@@ -501,7 +527,7 @@ PortSecurityPolicy PortGroupImpl::GetOwnSecurityPolicy() const {
     return Detail::OwnPolicy<PortSecurityPolicy>(Stored().json);
 }
 void PortGroupImpl::SetOwnSecurityPolicy(const PortSecurityPolicy& policy) {
-    document_ = WriteOwnPolicy("PortGroupImpl::SetOwnSecurityPolicy", name_, policy);
+    document_ = WriteOwnPolicy("PortGroupImpl::SetOwnSecurityPolicy", Stored().json, policy);
 }
 
 ShapingPolicy PortGroupImpl::GetShapingPolicy() const {
@@ -511,7 +537,7 @@ ShapingPolicy PortGroupImpl::GetOwnShapingPolicy() const {
     return Detail::OwnPolicy<ShapingPolicy>(Stored().json);
 }
 void PortGroupImpl::SetOwnShapingPolicy(const ShapingPolicy& policy) {
-    document_ = WriteOwnPolicy("PortGroupImpl::SetOwnShapingPolicy", name_, policy);
+    document_ = WriteOwnPolicy("PortGroupImpl::SetOwnShapingPolicy", Stored().json, policy);
 }
 
 // ------------------------------------------------------------------- PnicImpl
