@@ -54,6 +54,12 @@ std::string FormatHints::Unit(const std::string& type, const std::string& field)
     return cached->second;
 }
 
+std::string JoinNames(const std::vector<std::string>& names, const std::string& separator) {
+    std::string joined;
+    for (const auto& name : names) joined += (joined.empty() ? "" : separator) + name;
+    return joined;
+}
+
 std::vector<std::string> SplitNames(const std::string& text) {
     // Empty pieces ("a,,b", a trailing comma) name no field and are dropped.
     std::vector<std::string> names;

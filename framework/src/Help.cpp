@@ -16,12 +16,6 @@ const char* const kGlobalOptions[][2] = {
     {"--version", "Print the version of the CLI and exit."},
 };
 
-std::string Joined(const std::vector<std::string>& names) {
-    std::string joined;
-    for (const auto& n : names) joined += (joined.empty() ? "" : ", ") + n;
-    return joined;
-}
-
 void RenderChildren(const NamespaceNode& node, bool commands, const char* title, std::ostream& out) {
     std::size_t width = 0;
     for (const auto& child : node.GetChildren()) {
@@ -83,7 +77,7 @@ std::string ExpandDescription(const CallSpec::ParameterSpec& parameter, const st
         }
     }
     text = ReplaceAll(text, "%FULLENUM%", full);
-    return ReplaceAll(text, "%ENUM%", Joined(values));
+    return ReplaceAll(text, "%ENUM%", JoinNames(values));
 }
 
 void RenderNamespaceHelp(const NamespaceNode& node, const std::string& program, const std::string& path,
@@ -94,7 +88,7 @@ void RenderNamespaceHelp(const NamespaceNode& node, const std::string& program, 
         out << "\nOptions:\n";
         for (const auto& option : kGlobalOptions) {
             std::string text = option[1];
-            if (std::string(option[0]).rfind("--formatter", 0) == 0) text += Joined(FormatterNames()) + ".";
+            if (std::string(option[0]).rfind("--formatter", 0) == 0) text += JoinNames(FormatterNames()) + ".";
             out << "  " << option[0] << std::string(20 - std::string(option[0]).size(), ' ') << text << "\n";
         }
     }

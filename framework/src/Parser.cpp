@@ -8,6 +8,7 @@
 
 #include <regex>
 
+#include "framework/Format.h"
 #include "framework/Runner.h"
 
 namespace AutoCli {
@@ -17,12 +18,6 @@ namespace {
 std::string Lower(std::string text) {
     std::transform(text.begin(), text.end(), text.begin(), [](unsigned char c) { return std::tolower(c); });
     return text;
-}
-
-std::string JoinInts(const std::vector<std::int64_t>& values) {
-    std::string joined;
-    for (std::int64_t v : values) joined += (joined.empty() ? "" : ", ") + std::to_string(v);
-    return joined;
 }
 
 std::size_t EditDistance(const std::string& a, const std::string& b) {
@@ -61,8 +56,10 @@ void CheckIntConstraint(const CallSpec::ParameterSpec& p, const std::string& tex
         case CallSpec::CONSTRAINT_INT_ENUM: {
             const auto& allowed = c->GetIntEnum();
             if (std::find(allowed.begin(), allowed.end(), value) == allowed.end()) {
+                std::vector<std::string> texts;
+                for (std::int64_t v : allowed) texts.push_back(std::to_string(v));
                 throw UsageError("Value " + text + " for " + OptionName(p) + " is not allowed: it must be one of " +
-                                 JoinInts(allowed));
+                                 JoinNames(texts));
             }
             return;
         }
@@ -79,10 +76,8 @@ void CheckStringConstraint(const CallSpec::ParameterSpec& p, const std::string& 
             std::vector<std::string> allowed;
             for (const auto& e : c->GetStringEnum()) allowed.push_back(e.value);
             if (std::find(allowed.begin(), allowed.end(), value) != allowed.end()) return;
-            std::string joined;
-            for (const auto& a : allowed) joined += (joined.empty() ? "" : ", ") + a;
             std::string message =
-                "Invalid value '" + value + "' for " + OptionName(p) + ": it must be one of " + joined;
+                "Invalid value '" + value + "' for " + OptionName(p) + ": it must be one of " + JoinNames(allowed);
             std::string suggestion = SuggestClosest(value, allowed);
             if (!suggestion.empty()) message += ". Did you mean '" + suggestion + "'?";
             throw UsageError(message);

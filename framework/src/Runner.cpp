@@ -22,9 +22,7 @@ struct CommandLine {
 };
 
 std::string JoinPath(const std::vector<std::string>& words) {
-    std::string path;
-    for (const auto& w : words) path += (path.empty() ? "" : " ") + w;
-    return path;
+    return JoinNames(words, " ");
 }
 
 bool IsOption(const std::string& token) {
@@ -32,9 +30,7 @@ bool IsOption(const std::string& token) {
 }
 
 std::string FormatterList() {
-    std::string names;
-    for (const auto& n : FormatterNames()) names += (names.empty() ? "" : ", ") + n;
-    return names;
+    return JoinNames(FormatterNames());
 }
 
 // Walks the tree along the leading words, collecting the global options met

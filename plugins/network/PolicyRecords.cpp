@@ -3,6 +3,8 @@
 #include <algorithm>
 #include <iterator>
 
+#include "framework/Format.h"
+
 namespace OrvixCli {
 namespace NetworkNamespace {
 
@@ -91,9 +93,7 @@ void DescribePolicyFetcher(AutoCli::Command& command, PolicyKind kind, const std
     if (withOverrides) {
         for (const std::string& setting : OverriddenSettings(kind)) fields.push_back(Override(setting));
     }
-    std::string joined;
-    for (const std::string& field : fields) joined += (joined.empty() ? "" : ",") + field;
-    command.SetDefaultOutputParameter("fields:" + record, joined);
+    command.SetDefaultOutputParameter("fields:" + record, AutoCli::JoinNames(fields, ","));
     command.SetDefaultOutputParameter("header:" + record, "<NONE>");
     if (kind == PolicyKind::Shaping) {
         for (const char* field : {kAverageBandwidth, kPeakBandwidth}) {

@@ -1,6 +1,6 @@
-// What the twelve policy commands share before and after they touch a
-// policy: the parameter naming the switch or port group, its lookup with the
-// message for an unknown name, and the end of a set command.
+// What the commands that work on one switch or port group by name share
+// (the policy commands and portgroup set): the parameter naming it, its
+// lookup with the message for an unknown name, and the end of a set command.
 #pragma once
 
 #include <memory>

@@ -1,14 +1,10 @@
 #include "VirtualSwitchPortGroupSet.h"
 
-#include <memory>
-
 #include "CommandSupport.h"
-#include "hostctl/network/Network.h"
+#include "PolicyTargets.h"
 
 namespace OrvixCli {
 namespace NetworkNamespace {
-
-using HostCtl::Network::PortGroup;
 
 VirtualSwitchPortGroupSet::VirtualSwitchPortGroupSet() {
     SetDescription("Set the vlan id for the given port group");
@@ -23,14 +19,14 @@ boost::shared_ptr<CallSpec::InputSpec> VirtualSwitchPortGroupSet::GetInputSpecIn
                      "The name of the port group to set vlan id for.", true);
     // The help text and the check are made from the same two library
     // constants, so they cannot disagree.
-    const unsigned minVlan = PortGroup::MIN_VLAN_ID;
-    const unsigned maxVlan = PortGroup::MAX_VLAN_ID;
+    const unsigned minVlan = HostCtl::Network::PortGroup::MIN_VLAN_ID;
+    const unsigned maxVlan = HostCtl::Network::PortGroup::MAX_VLAN_ID;
     boost::shared_ptr<CallSpec::ParameterConstraint> vlanRange =
         CallSpec::ParameterConstraint::New(CallSpec::CONSTRAINT_INT_RANGE);
     vlanRange->SetIntRange(minVlan, maxVlan);
     DeclareParameter(declared, "vlan-id", CallSpec::PARAM_INT, "v",
-                     "The vlan id for this port group. This value is in the range (" + std::to_string(minVlan) +
-                         " - " + std::to_string(maxVlan) + ")",
+                     "The vlan id for this port group. This value is in the range (" + std::to_string(minVlan) + " - " +
+                         std::to_string(maxVlan) + ")",
                      false, vlanRange);
     return declared;
 }
@@ -41,16 +37,10 @@ boost::shared_ptr<CallSpec::OutputSpec> VirtualSwitchPortGroupSet::GetOutputSpec
 
 void VirtualSwitchPortGroupSet::ExecuteInternal(boost::shared_ptr<CallSpec::Input> input,
                                                 boost::shared_ptr<CallSpec::Output> output) {
-    ReportingHostErrors(output, [&] {
-        const std::string name = input->GetString("portgroup-name");
-        std::unique_ptr<PortGroup> portGroup = HostCtl::Network::NetworkFactory::GetPortGroupByName(name);
-        if (!portGroup) {
-            output->SetError("Unable to find a port group with the name " + name);
-            return;
-        }
+    OnPortGroup(input, output, [&](HostCtl::Network::PortGroup& portGroup) {
         // Without --vlan-id the framework's 0 for a missing integer would
         // silently untag the port group; only a given value is written.
-        if (input->IsSet("vlan-id")) portGroup->SetVlanId(input->GetInt("vlan-id"));
+        if (input->IsSet("vlan-id")) portGroup.SetVlanId(input->GetInt("vlan-id"));
         FinishTrue(output);
     });
 }

@@ -58,4 +58,8 @@ ProcessResult RunProcess(const std::vector<std::string>& argv, const std::string
 
 std::vector<std::string> SplitLines(const std::string& text);
 
+// The sanitizer settings of this test run ("ASAN_OPTIONS=..."), for the
+// environment of the programs it starts.
+std::vector<std::string> SanitizerEnvironment();
+
 }  // namespace OrvixTest

@@ -14,9 +14,7 @@ const std::string kTestPlugins = kBin + "/../lib/test-plugins";
 
 std::vector<std::string> BaseEnv(const std::string& dir) {
     std::vector<std::string> env = {"PATH=/usr/bin:/bin", "HOME=" + dir, "ORVIX_HOST_DB=" + dir + "/host.db"};
-    for (const char* name : {"ASAN_OPTIONS", "UBSAN_OPTIONS", "LSAN_OPTIONS"}) {
-        if (const char* value = std::getenv(name)) env.push_back(std::string(name) + "=" + value);
-    }
+    for (const auto& setting : SanitizerEnvironment()) env.push_back(setting);
     return env;
 }
 

@@ -50,10 +50,7 @@ std::vector<std::string> Environment(const Transcript& t, const std::string& dir
         "ORVIX_HOST_DB=" + dir + "/host.db",
         "LC_ALL=C",
     };
-    // Sanitizer settings of the test run reach the programs it starts.
-    for (const char* name : {"ASAN_OPTIONS", "UBSAN_OPTIONS", "LSAN_OPTIONS"}) {
-        if (const char* value = std::getenv(name)) env.push_back(std::string(name) + "=" + value);
-    }
+    for (const auto& setting : SanitizerEnvironment()) env.push_back(setting);
     if (!t.profile.empty()) env.push_back("ORVIX_HOST_PROFILE=" + t.profile);
     for (const auto& kv : t.env) env.push_back(kv.first + "=" + kv.second);
     return env;

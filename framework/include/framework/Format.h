@@ -49,6 +49,8 @@ private:
 
 // Splits "a,b,c" into its names; an empty text gives no names.
 std::vector<std::string> SplitNames(const std::string& text);
+// The names joined by `separator`: "a, b, c" by default.
+std::string JoinNames(const std::vector<std::string>& names, const std::string& separator = ", ");
 
 class Formatter {
 public:
@@ -56,8 +58,7 @@ public:
     virtual const char* Name() const = 0;
     // Renders a result. A null result, or a boolean made without a value,
     // renders as nothing.
-    virtual void Render(const MetaObj::MetaObjectPtr& result, const FormatHints& hints,
-                        std::ostream& out) const = 0;
+    virtual void Render(const MetaObj::MetaObjectPtr& result, const FormatHints& hints, std::ostream& out) const = 0;
 };
 
 // The formatters by name: simple, table, json, xml, csv, keyvalue.

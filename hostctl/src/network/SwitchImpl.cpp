@@ -39,6 +39,10 @@ std::string NotFoundSwitch(const std::string& name) {
     return "Unable to find virtual switch with the name " + name;
 }
 
+std::string NotFoundPortGroup(const std::string& name) {
+    return "Unable to find a port group with the name " + name;
+}
+
 Json RequireSwitch(Transaction& t, const std::string& name) {
     std::optional<Json> vswitch = t.Get("vswitches", name);
     if (!vswitch) throw HostCtlException(NotFoundSwitch(name));
@@ -47,7 +51,7 @@ Json RequireSwitch(Transaction& t, const std::string& name) {
 
 Json RequirePortGroup(Transaction& t, const std::string& name) {
     std::optional<Json> portGroup = t.Get("portgroups", name);
-    if (!portGroup) throw HostCtlException("Unable to find a port group with the name " + name);
+    if (!portGroup) throw HostCtlException(NotFoundPortGroup(name));
     return *portGroup;
 }
 
@@ -464,7 +468,7 @@ const Detail::Document& PortGroupImpl::Stored() const {
     if (!document_) {
         Store::HostStore& store = Detail::EnterOperation("PortGroupImpl::Get", name_);
         std::optional<Json> portGroup = store.Get("portgroups", name_);
-        if (!portGroup) throw HostCtlException("Unable to find a port group with the name " + name_);
+        if (!portGroup) throw HostCtlException(NotFoundPortGroup(name_));
         document_ = Detail::MakeDocument(std::move(*portGroup));
     }
     return *document_;
