@@ -6,7 +6,7 @@ if(NOT CLASH EQUAL -1)
 endif()
 file(WRITE ${OUTPUT}.tmp
 "// Generated from profiles/default.json; do not edit.
-#include \"hostctl/store/HostStore.h\"
+#include \"hoststore/HostStore.h\"
 
 namespace PldCtl {
 namespace Store {

@@ -4,7 +4,7 @@
 
 #include <string>
 
-#include "hostctl/store/HostStore.h"
+#include "hoststore/HostStore.h"
 
 namespace PldCtl {
 namespace Detail {

@@ -1,10 +1,10 @@
-// Runs every transcript in tests/e2e/cases against the real binaries.
-#include <dirent.h>
+// Runs every transcript below tests/e2e/cases against the real binaries.
 #include <stdlib.h>
 #include <unistd.h>
 
 #include <algorithm>
 #include <cstdlib>
+#include <filesystem>
 #include <fstream>
 #include <sstream>
 
@@ -17,14 +17,14 @@ namespace {
 
 const std::string kE2eDir = std::string(ORVIX_TESTS_DIR) + "/e2e";
 
+// Every transcript below cases/, room folders included, by its path there.
 std::vector<std::string> TranscriptNames() {
     std::vector<std::string> names;
-    if (DIR* d = opendir((kE2eDir + "/cases").c_str())) {
-        while (dirent* e = readdir(d)) {
-            std::string name = e->d_name;
-            if (name.size() > 2 && name.compare(name.size() - 2, 2, ".t") == 0) names.push_back(name);
+    const std::filesystem::path cases = kE2eDir + "/cases";
+    for (const auto& entry : std::filesystem::recursive_directory_iterator(cases)) {
+        if (entry.is_regular_file() && entry.path().extension() == ".t") {
+            names.push_back(entry.path().lexically_relative(cases).string());
         }
-        closedir(d);
     }
     std::sort(names.begin(), names.end());
     return names;

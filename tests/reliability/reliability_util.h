@@ -13,7 +13,7 @@
 #include <string>
 #include <vector>
 
-#include "../hostctl/test_store_util.h"
+#include "support/store_test_util.h"
 
 extern char** environ;
 

@@ -13,7 +13,7 @@
 #include <string>
 #include <vector>
 
-#include "hostctl/store/HostStore.h"
+#include "hoststore/HostStore.h"
 
 namespace {
 

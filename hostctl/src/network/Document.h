@@ -6,8 +6,8 @@
 #include <string>
 #include <vector>
 
-#include "hostctl/network/Policy.h"
-#include "hostctl/store/HostStore.h"
+#include "hostctl/network/vswitch/Policy.h"
+#include "hoststore/HostStore.h"
 
 namespace PldCtl {
 namespace Detail {

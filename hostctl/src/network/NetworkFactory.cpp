@@ -1,7 +1,9 @@
-#include "../Operation.h"
-#include "Document.h"
-#include "hostctl/network/Network.h"
-#include "hostctl/network/SwitchImpl.h"
+#include "hostctl/network/NetworkFactory.h"
+
+#include "Operation.h"
+#include "hostctl/network/ip/PldNic.h"
+#include "hostctl/network/vswitch/SwitchImpl.h"
+#include "network/Document.h"
 
 namespace HostCtl {
 namespace Network {
@@ -9,7 +11,6 @@ namespace Network {
 Portset::~Portset() = default;
 VirtualSwitch::~VirtualSwitch() = default;
 PortGroup::~PortGroup() = default;
-Pnic::~Pnic() = default;
 PldNic::~PldNic() = default;
 
 std::unique_ptr<VirtualSwitch> NetworkFactory::GetVirtualSwitchById(const std::string& name) {

@@ -1,8 +1,9 @@
 #include "hostctl/network/NetworkInfoImpl.h"
 
-#include "../Operation.h"
-#include "Document.h"
-#include "hostctl/network/SwitchImpl.h"
+#include "Operation.h"
+#include "network/Document.h"
+#include "hostctl/network/nic/PnicImpl.h"
+#include "hostctl/network/vswitch/SwitchImpl.h"
 
 namespace PldCtl {
 namespace Network {

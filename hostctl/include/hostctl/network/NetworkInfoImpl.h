@@ -4,7 +4,8 @@
 #include <memory>
 #include <vector>
 
-#include "hostctl/network/Network.h"
+#include "hostctl/network/nic/Pnic.h"
+#include "hostctl/network/vswitch/VirtualSwitch.h"
 
 namespace PldCtl {
 namespace Network {

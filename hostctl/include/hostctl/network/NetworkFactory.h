@@ -1,0 +1,23 @@
+// Lookups of the host's networking objects by name; what they hand out is
+// new and belongs to the caller.
+#pragma once
+
+#include <memory>
+#include <string>
+
+#include "hostctl/network/vswitch/VirtualSwitch.h"
+
+namespace HostCtl {
+namespace Network {
+
+// Lookups of the host's networking objects.
+class NetworkFactory {
+public:
+    // The standard switch of that name, or null.
+    static std::unique_ptr<VirtualSwitch> GetVirtualSwitchById(const std::string& name);
+    // The port group of that name, or null.
+    static std::unique_ptr<PortGroup> GetPortGroupByName(const std::string& name);
+};
+
+}  // namespace Network
+}  // namespace HostCtl

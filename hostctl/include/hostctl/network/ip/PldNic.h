@@ -1,0 +1,18 @@
+// The host-control library's interface of one kernel IP interface.
+#pragma once
+
+
+namespace HostCtl {
+namespace Network {
+
+// A kernel IP interface.
+class PldNic {
+public:
+    static constexpr int MIN_MTU = 1280;
+    static constexpr int MAX_MTU = 9000;
+
+    virtual ~PldNic();
+};
+
+}  // namespace Network
+}  // namespace HostCtl

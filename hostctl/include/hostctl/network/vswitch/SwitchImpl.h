@@ -1,0 +1,147 @@
+// The library's implementations of port sets, standard switches and port
+// groups, and the entry classes that find and create them.
+#pragma once
+
+#include <memory>
+#include <optional>
+#include <string>
+#include <vector>
+
+#include "hostctl/network/vswitch/VirtualSwitch.h"
+
+namespace PldCtl {
+namespace Detail {
+// A stored object of the host, as the library read it.
+struct Document;
+// A switch read while listing all of them, with what the listing read for it.
+struct ListedSwitch;
+}  // namespace Detail
+
+namespace Network {
+
+// A port set as the host stores it; the base of every kind of switch.
+class PortsetImpl : public virtual HostCtl::Network::Portset {
+public:
+    ~PortsetImpl() override;
+
+    // Whether the host has a standard switch of that name.
+    static bool IsValidVirtualSwitch(const std::string& name);
+
+    std::string GetName() const override;
+    std::string GetClassName() const override;
+    int GetNumPorts() const override;
+    int GetNumUsedPorts() const override;
+    int GetNumConfiguredPorts() const override;
+    std::vector<std::string> GetUplinks() const override;
+
+protected:
+    explicit PortsetImpl(std::shared_ptr<Detail::Document> document,
+                         std::optional<std::pair<int, int>> portCounts = std::nullopt);
+    // Takes the stored object as a change left it.
+    void Refresh(std::shared_ptr<Detail::Document> document);
+    std::shared_ptr<Detail::Document> document_;
+
+private:
+    // Read from the host's ports on first use: configured, used.
+    mutable std::optional<std::pair<int, int>> portCounts_;
+    const std::pair<int, int>& PortCounts() const;
+};
+
+class VirtualSwitchImpl : public PortsetImpl, public virtual HostCtl::Network::VirtualSwitch {
+public:
+    // A snapshot of a stored "vswitches" object.
+    explicit VirtualSwitchImpl(std::shared_ptr<Detail::Document> document);
+    // The same, with the port counts and port groups a listing read for it.
+    explicit VirtualSwitchImpl(const Detail::ListedSwitch& listed);
+    ~VirtualSwitchImpl() override;
+
+    int GetMTU() const override;
+    void SetMTU(long long mtu) override;
+    std::string GetCDPStatus() const override;
+    void SetCDPStatus(int index) override;
+    bool IsBeaconEnabled() const override;
+    int GetBeaconInterval() const override;
+    int GetBeaconThreshold() const override;
+    std::vector<std::string> GetBeaconRequiredBy() const override;
+    std::vector<std::unique_ptr<HostCtl::Network::PortGroup>> GetPortGroups() const override;
+    std::unique_ptr<HostCtl::Network::PortGroup> AddPortGroup(const std::string& name) override;
+    void RemovePortGroup(const std::string& name) override;
+    void AddUplink(const std::string& nic) override;
+    void RemoveUplink(const std::string& nic, bool removeFromPolicies) override;
+    HostCtl::Network::NicTeamingPolicy GetTeamingPolicy() const override;
+    HostCtl::Network::NicTeamingPolicy GetConfiguredTeamingPolicy() const override;
+    void SetTeamingPolicy(const HostCtl::Network::NicTeamingPolicy& policy) override;
+    HostCtl::Network::PortSecurityPolicy GetSecurityPolicy() const override;
+    void SetSecurityPolicy(const HostCtl::Network::PortSecurityPolicy& policy) override;
+    HostCtl::Network::ShapingPolicy GetShapingPolicy() const override;
+    void SetShapingPolicy(const HostCtl::Network::ShapingPolicy& policy) override;
+
+private:
+    // The switch's port groups as stored, read on first use: listing a switch
+    // asks for them twice (names, and which of them require beaconing).
+    const std::vector<std::shared_ptr<Detail::Document>>& PortGroupDocuments() const;
+    mutable std::optional<std::vector<std::shared_ptr<Detail::Document>>> portGroups_;
+};
+
+// A port group, found by name. Made from a name it never throws; its
+// operations throw when the host has no port group of that name.
+class PortGroupImpl : public virtual HostCtl::Network::PortGroup {
+public:
+    explicit PortGroupImpl(const std::string& name);
+    // A snapshot of a stored "portgroups" object; a listing that counted the
+    // active clients of every port group at once hands the count along.
+    explicit PortGroupImpl(std::shared_ptr<Detail::Document> document, std::optional<int> activeClients = std::nullopt);
+    ~PortGroupImpl() override;
+
+    // The ports of the port group that are in use by a client.
+    int GetActiveClients() const;
+
+    std::string GetName() const override;
+    std::string GetVirtualSwitchName() const override;
+    std::unique_ptr<HostCtl::Network::VirtualSwitch> GetVirtualSwitch() const override;
+    int GetVlanId() const override;
+    void SetVlanId(long long vlanId) override;
+    HostCtl::Network::NicTeamingPolicy GetTeamingPolicy() const override;
+    HostCtl::Network::NicTeamingPolicy GetOwnTeamingPolicy() const override;
+    void SetOwnTeamingPolicy(const HostCtl::Network::NicTeamingPolicy& policy) override;
+    HostCtl::Network::PortSecurityPolicy GetSecurityPolicy() const override;
+    HostCtl::Network::PortSecurityPolicy GetOwnSecurityPolicy() const override;
+    void SetOwnSecurityPolicy(const HostCtl::Network::PortSecurityPolicy& policy) override;
+    HostCtl::Network::ShapingPolicy GetShapingPolicy() const override;
+    HostCtl::Network::ShapingPolicy GetOwnShapingPolicy() const override;
+    void SetOwnShapingPolicy(const HostCtl::Network::ShapingPolicy& policy) override;
+
+private:
+    // The stored object, read on first use.
+    const Detail::Document& Stored() const;
+    // The switch's stored object, for the policies in force.
+    std::shared_ptr<Detail::Document> SwitchDocument() const;
+    std::string name_;
+    mutable std::shared_ptr<Detail::Document> document_;
+    std::optional<int> activeClients_;
+};
+
+// The host's standard switches.
+class VirtualSwitchInfoImpl {
+public:
+    VirtualSwitchInfoImpl();
+    virtual ~VirtualSwitchInfoImpl();
+
+    // In the host's order.
+    virtual std::vector<std::unique_ptr<HostCtl::Network::VirtualSwitch>> GetVirtualSwitches();
+    // Null when there is none.
+    virtual std::unique_ptr<HostCtl::Network::VirtualSwitch> GetVirtualSwitchByName(const std::string& name);
+    // Throws for a name in use or not fit for a switch, a port count outside
+    // 1 to Portset::MAX_NUM_PORTS, or one that would take the host past its
+    // limit of ports.
+    virtual std::unique_ptr<HostCtl::Network::VirtualSwitch> AddVirtualSwitchWithPolicy(
+        const HostCtl::Network::NicTeamingPolicy& teaming, const HostCtl::Network::PortSecurityPolicy& security,
+        const HostCtl::Network::ShapingPolicy& shaping, const HostCtl::Network::NicCapabilities& capabilities,
+        const std::string& name, long long numPorts);
+    // Throws for a switch the host does not have, or one whose ports are in
+    // use by anything but its uplinks.
+    virtual void RemoveVirtualSwitch(const std::string& name);
+};
+
+}  // namespace Network
+}  // namespace PldCtl

@@ -1,0 +1,56 @@
+// What the store's source files share and nobody else sees.
+#pragma once
+
+#include <functional>
+#include <optional>
+#include <string>
+
+#include "Sqlite.h"
+#include "hoststore/HostStore.h"
+
+namespace PldCtl {
+namespace Store {
+
+struct HostStore::Impl {
+    // What the connection is doing; Change() and Read() refuse to start while
+    // another one runs, and Transaction refuses writes outside Change().
+    enum class Mode { Idle, Reading, Writing };
+
+    explicit Impl(const std::string& path) : db(path) {}
+
+    // Runs body inside one transaction (BEGIN IMMEDIATE when writing, so the
+    // write lock is taken up front and a change never fails half-way on a
+    // lock). A busy store rolls back and the whole body runs again, with a
+    // growing, jittered pause, until a deadline. Any other exception rolls
+    // back and propagates.
+    void Run(Mode transactionMode, const std::function<void()>& body);
+    // Throws std::logic_error while a Change() or Read() runs.
+    void RequireIdle() const;
+    // The connection, for a write; only Change() may write.
+    Sql::Database& Writable();
+
+    Sql::Database db;
+    Mode mode = Mode::Idle;
+    // Set once the fault table was found empty; see CheckFault.
+    bool noFaults = false;
+};
+
+// The text of a key or parent field: a string as it is, an integer in
+// decimal. nullopt when the field is absent or null; ProfileError for any
+// other type.
+std::optional<std::string> FieldText(const Json& object, const char* field);
+
+bool IsSingleton(const std::string& name);
+
+// Whether anything, even a dangling link, has this name: creating a store
+// never replaces what is there.
+bool PathExists(const std::string& path);
+
+// A stored object; a document that is not JSON means a damaged store.
+Json ParseDoc(const Sql::Database& db, const std::string& text);
+
+// SQL text with every "%T" replaced by the quoted table name.
+std::string TableSql(const std::string& table, const char* format);
+
+}  // namespace Store
+}  // namespace PldCtl

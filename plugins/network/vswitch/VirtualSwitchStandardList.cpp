@@ -1,0 +1,116 @@
+#include "vswitch/VirtualSwitchStandardList.h"
+
+#include <algorithm>
+#include <memory>
+#include <set>
+#include <string>
+#include <vector>
+
+#include "common/CommandSupport.h"
+#include "hostctl/network/NetworkInfoImpl.h"
+#include "hostctl/network/vswitch/SwitchImpl.h"
+
+namespace OrvixCli {
+namespace NetworkNamespace {
+
+namespace {
+
+using SwitchList = std::vector<std::unique_ptr<HostCtl::Network::VirtualSwitch>>;
+
+std::set<std::string> PnicNames(PldCtl::Network::NetworkInfoImpl& networkInfo) {
+    std::set<std::string> names;
+    for (const auto& pnic : networkInfo.GetPnics()) names.insert(pnic->GetName());
+    return names;
+}
+
+// Fills a VirtualSwitch record, field by field in the order of the output.
+void FillSwitchRecord(MetaObj::MetaStruct& record, const HostCtl::Network::VirtualSwitch& vswitch,
+                      const std::set<std::string>& pnics) {
+    record.SetField("Name", vswitch.GetName());
+    record.SetField("Class", vswitch.GetClassName());
+    record.SetField("Num Ports", vswitch.GetNumPorts());
+    record.SetField("Used Ports", vswitch.GetNumUsedPorts());
+    record.SetField("Configured Ports", vswitch.GetNumConfiguredPorts());
+    record.SetField("MTU", vswitch.GetMTU());
+    record.SetField("CDP Status", vswitch.GetCDPStatus());
+    record.SetField("Beacon Enabled", vswitch.IsBeaconEnabled());
+    record.SetField("Beacon Interval", vswitch.GetBeaconInterval());
+    record.SetField("Beacon Threshold", vswitch.GetBeaconThreshold());
+    record.SetField("Beacon Required By", vswitch.GetBeaconRequiredBy());
+    // A switch may still name a NIC the host no longer has; only NICs that
+    // exist are shown, in the switch's order.
+    std::vector<std::string> uplinks = vswitch.GetUplinks();
+    uplinks.erase(std::remove_if(uplinks.begin(), uplinks.end(),
+                                 [&](const std::string& uplink) { return pnics.count(uplink) == 0; }),
+                  uplinks.end());
+    record.SetField("Uplinks", uplinks);
+    std::vector<std::string> portGroupNames;
+    for (const auto& portGroup : vswitch.GetPortGroups()) portGroupNames.push_back(portGroup->GetName());
+    record.SetField("Portgroups", portGroupNames);
+}
+
+}  // namespace
+
+VirtualSwitchStandardList::VirtualSwitchStandardList() {
+    SetDescription("List the virtual switches current on the Tovrin host.");
+    SetMetaDataField("type", "fetcher");
+    SetDefaultOutputFormatter("simple");
+    SetDefaultOutputParameter("header:VirtualSwitch", "%Name%");
+    SetDefaultOutputParameter("fields:VirtualSwitch",
+                              "Name,Class,Num Ports,Used Ports,Configured Ports,MTU,CDP Status,Beacon Enabled,Beacon "
+                              "Interval,Beacon Threshold,Beacon Required By,Uplinks,Portgroups");
+}
+
+ORVIX_COMMAND_NEW(VirtualSwitchStandardList)
+
+boost::shared_ptr<CallSpec::InputSpec> VirtualSwitchStandardList::GetInputSpecInternal() {
+    boost::shared_ptr<CallSpec::InputSpec> declared = CallSpec::InputSpec::New();
+    DeclareParameter(declared, "vswitch-name", CallSpec::PARAM_STRING, "v",
+                     "Limit the output of this command to only virtual switches with the given name.", false);
+    return declared;
+}
+
+boost::shared_ptr<CallSpec::OutputSpec> VirtualSwitchStandardList::GetOutputSpecInternal() {
+    return OutputSpecOf(MetaObj::MetaList::New(MetaObj::META_STRUCT, GetOutputStructure()));
+}
+
+boost::shared_ptr<MetaObj::MetaStruct> VirtualSwitchStandardList::GetOutputStructure() {
+    return MetaObj::MetaStruct::New("VirtualSwitch");
+}
+
+void VirtualSwitchStandardList::ExecuteInternal(boost::shared_ptr<CallSpec::Input> input,
+                                                boost::shared_ptr<CallSpec::Output> output) {
+    PldCtl::Network::VirtualSwitchInfoImpl switchInfo;
+    PldCtl::Network::NetworkInfoImpl networkInfo;
+    ReportingHostErrors(output, [&] {
+        const std::string name = input->GetString("vswitch-name");
+        SwitchList switches;
+        if (name.empty()) {
+            switches = switchInfo.GetVirtualSwitches();
+        } else {
+            // Kept even when null: an unknown name then ends the walk below
+            // like any switch that cannot be read.
+            switches.push_back(switchInfo.GetVirtualSwitchByName(name));
+        }
+        const std::set<std::string> pnics = PnicNames(networkInfo);
+
+        boost::shared_ptr<MetaObj::MetaList> records =
+            MetaObj::MetaList::New(MetaObj::META_STRUCT, GetOutputStructure());
+        bool complete = true;
+        for (const auto& vswitch : switches) {
+            if (!dynamic_cast<const PldCtl::Network::VirtualSwitchImpl*>(vswitch.get())) {
+                complete = false;
+                break;
+            }
+            boost::shared_ptr<MetaObj::MetaStruct> record = GetOutputStructure();
+            FillSwitchRecord(*record, *vswitch, pnics);
+            records->Append(record);
+        }
+        // The switches read so far are still shown beside the error.
+        if (!complete) output->SetError("Unable to access all portsets");
+        Finish(output, records);
+    });
+}
+
+}  // namespace NetworkNamespace
+}  // namespace OrvixCli

@@ -1,0 +1,184 @@
+// Creating and opening store files, finding the default store, and refusing
+// files that are not (or no longer) ours without touching them.
+#include <gtest/gtest.h>
+#include <sys/stat.h>
+
+#include <filesystem>
+#include <thread>
+
+#include "support/store_test_util.h"
+
+namespace {
+
+using PldCtl::Store::HostStore;
+using PldCtl::Store::Json;
+using PldCtl::Store::StoreError;
+using StoreTest::ScopedEnv;
+
+std::string OpenError(const std::string& path) {
+    try {
+        HostStore::Open(path);
+    } catch (const StoreError& e) {
+        return e.what();
+    }
+    return "(opened)";
+}
+
+std::vector<std::string> DirectoryEntries(const std::string& directory) {
+    std::vector<std::string> names;
+    for (const auto& entry : std::filesystem::directory_iterator(directory)) names.push_back(entry.path().filename());
+    std::sort(names.begin(), names.end());
+    return names;
+}
+
+TEST(StoreOpenTest, CreateBuildsACompleteStoreInPrivateDirectories) {
+    StoreTest::TempDir dir;
+    const std::string path = dir / "state/orvix/host.db";
+    auto store = HostStore::Create(path, StoreTest::Fixture("small-host.json"), "small-host.json");
+    EXPECT_EQ(store->Path(), path);
+    struct stat st {};
+    ASSERT_EQ(stat((dir / "state").c_str(), &st), 0);
+    EXPECT_EQ(st.st_mode & 0777, 0700u);
+    store.reset();
+    // Nothing but the store is left: no temporary file, no side file.
+    EXPECT_EQ(DirectoryEntries(dir / "state/orvix"), std::vector<std::string>{"host.db"});
+    EXPECT_EQ(StoreTest::RawSql(path, "PRAGMA journal_mode"), "wal");
+    EXPECT_EQ(StoreTest::RawSql(path, "PRAGMA application_id"), std::to_string(0x4F525658));
+    EXPECT_EQ(StoreTest::RawSql(path, "PRAGMA user_version"), "1");
+    EXPECT_EQ(StoreTest::RawSql(path, "SELECT value FROM meta WHERE name = 'profile'"), "small-host.json");
+    EXPECT_EQ(HostStore::Open(path)->List("portgroups").size(), 3u);
+
+    const std::string before = StoreTest::ReadFile(path);
+    try {
+        HostStore::Create(path, StoreTest::EmptyProfileText());
+        FAIL() << "created over an existing store";
+    } catch (const StoreError& e) {
+        EXPECT_EQ(std::string(e.what()), "host store '" + path + "' exists already");
+    }
+    EXPECT_EQ(StoreTest::ReadFile(path), before);
+    // An existing store is opened as it is; the profile is not even read.
+    EXPECT_EQ(HostStore::OpenOrCreate(path, "not json")->List("nics").size(), 2u);
+}
+
+TEST(StoreOpenTest, BadProfileCreatesNothing) {
+    StoreTest::TempDir dir;
+    const std::string path = dir / "host.db";
+    EXPECT_THROW(HostStore::OpenOrCreate(path, "{"), PldCtl::Store::ProfileError);
+    EXPECT_THROW(HostStore::Create(path, R"({"format": "orvix-host-profile", "version": 1, "nic": []})"),
+                 PldCtl::Store::ProfileError);
+    EXPECT_TRUE(DirectoryEntries(dir.Path()).empty());
+}
+
+TEST(StoreOpenTest, RefusedFilesStayAsTheyWere) {
+    StoreTest::TempDir dir;
+    EXPECT_EQ(OpenError(dir / "missing.db"), "host store '" + (dir / "missing.db") + "' does not exist");
+    EXPECT_EQ(OpenError(dir.Path()), "host store '" + dir.Path() + "' is not a regular file");
+
+    const std::string newer = dir / "newer.db";
+    HostStore::Create(newer, StoreTest::EmptyProfileText());
+    StoreTest::RawSql(newer, "PRAGMA user_version = 7");
+    const std::string newerBytes = StoreTest::ReadFile(newer);
+    EXPECT_EQ(OpenError(newer),
+              "host store '" + newer + "' was written by a newer version (schema 7, this build reads up to 1)");
+    EXPECT_EQ(StoreTest::ReadFile(newer), newerBytes);
+
+    const std::string foreign = dir / "foreign.db";
+    StoreTest::RawSql(foreign, "CREATE TABLE t(x); INSERT INTO t VALUES (1)");
+    const std::string foreignBytes = StoreTest::ReadFile(foreign);
+    EXPECT_EQ(OpenError(foreign),
+              "host store '" + foreign + "' is an SQLite database of another application, not a host store");
+    EXPECT_EQ(StoreTest::ReadFile(foreign), foreignBytes);
+    // Refused opens leave no side files behind either.
+    EXPECT_EQ(DirectoryEntries(dir.Path()), (std::vector<std::string>{"foreign.db", "newer.db"}));
+}
+
+TEST(StoreOpenTest, ResolvePathFollowsTheEnvironment) {
+    ScopedEnv db("ORVIX_HOST_DB", "/srv/hosts/a.db");
+    ScopedEnv state("XDG_STATE_HOME", "/var/state");
+    ScopedEnv home("HOME", "/home/op");
+    EXPECT_EQ(HostStore::ResolvePath(), "/srv/hosts/a.db");
+    {
+        ScopedEnv emptyDb("ORVIX_HOST_DB", "");
+        EXPECT_EQ(HostStore::ResolvePath(), "/var/state/orvix/host.db");
+        ScopedEnv emptyState("XDG_STATE_HOME", "");
+        EXPECT_EQ(HostStore::ResolvePath(), "/home/op/.local/state/orvix/host.db");
+        ScopedEnv noState("XDG_STATE_HOME", std::nullopt);
+        EXPECT_EQ(HostStore::ResolvePath(), "/home/op/.local/state/orvix/host.db");
+        ScopedEnv noHome("HOME", std::nullopt);
+        EXPECT_THROW(HostStore::ResolvePath(), StoreError);
+    }
+}
+
+TEST(StoreOpenTest, DefaultStoreIsCreatedFromTheNamedProfile) {
+    StoreTest::TempDir dir;
+    const std::string path = dir / "sub/host.db";
+    ScopedEnv db("ORVIX_HOST_DB", path);
+    {
+        ScopedEnv profile("ORVIX_HOST_PROFILE", dir / "missing.json");
+        HostStore::ResetDefault();
+        try {
+            HostStore::Default();
+            FAIL() << "created from a missing profile";
+        } catch (const StoreError& e) {
+            const std::string message = e.what();
+            EXPECT_NE(message.find("'" + path + "'"), std::string::npos) << message;
+            EXPECT_NE(message.find(dir / "missing.json"), std::string::npos) << message;
+        }
+        StoreTest::WriteFile(dir / "bad.json", R"({"format": "orvix-host-profile", "version": 1, "nics": [{}]})");
+        ScopedEnv bad("ORVIX_HOST_PROFILE", dir / "bad.json");
+        try {
+            HostStore::Default();
+            FAIL() << "created from a bad profile";
+        } catch (const StoreError& e) {
+            EXPECT_EQ(std::string(e.what()), "host store '" + path + "' cannot be created: profile " +
+                                                 (dir / "bad.json") + ": nics[0]: key field 'name' is missing");
+        }
+        EXPECT_FALSE(std::filesystem::exists(path));
+    }
+    ScopedEnv profile("ORVIX_HOST_PROFILE", StoreTest::FixturePath("small-host.json"));
+    HostStore& store = HostStore::Default();
+    EXPECT_EQ(&store, &HostStore::Default());
+    EXPECT_EQ(store.Path(), path);
+    EXPECT_EQ(store.GetSingleton("system").at("hostname"), "host-a");
+
+    // After a reset the environment is read again.
+    const std::string other = dir / "other.db";
+    ScopedEnv otherDb("ORVIX_HOST_DB", other);
+    HostStore::ResetDefault();
+    EXPECT_EQ(HostStore::Default().Path(), other);
+    HostStore::ResetDefault();
+}
+
+TEST(StoreOpenTest, RacingCreatorsAllOpenTheWinnersStore) {
+    StoreTest::TempDir dir;
+    const std::string path = dir / "race/host.db";
+    constexpr int kCreators = 6;
+    std::vector<std::string> hostnames(kCreators);
+    std::vector<std::string> errors(kCreators);
+    std::vector<std::thread> threads;
+    for (int i = 0; i < kCreators; ++i) {
+        threads.emplace_back([&, i] {
+            try {
+                const Json profile = {{"format", "orvix-host-profile"},
+                                      {"version", 1},
+                                      {"system", {{"hostname", "creator-" + std::to_string(i)}}},
+                                      {"worlds", {{{"id", i}}}}};
+                auto store = HostStore::OpenOrCreate(path, profile, "thread");
+                hostnames[i] = store->GetSingleton("system").at("hostname");
+                // Each store is a complete one: its singleton and its world agree.
+                const std::string id = hostnames[i].substr(hostnames[i].find('-') + 1);
+                if (!store->Get("worlds", id)) errors[i] = "world " + id + " missing";
+            } catch (const std::exception& e) {
+                errors[i] = e.what();
+            }
+        });
+    }
+    for (auto& thread : threads) thread.join();
+    for (int i = 0; i < kCreators; ++i) {
+        EXPECT_EQ(errors[i], "");
+        EXPECT_EQ(hostnames[i], hostnames[0]);
+    }
+    EXPECT_EQ(DirectoryEntries(dir / "race"), std::vector<std::string>{"host.db"});
+}
+
+}  // namespace
