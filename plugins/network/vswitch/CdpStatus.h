@@ -13,9 +13,6 @@
 namespace OrvixCli {
 namespace NetworkNamespace {
 
-// "down", "listen", "advertise", "both", in index order.
-extern const std::array<std::string, 4> kCdpStatusWords;
-
 // The index of a CDP status word. Any text that is not one of the first
 // three words means "both", the last entry.
 int CdpStatusIndex(const std::string& word);

@@ -11,6 +11,7 @@
 #include "Operation.h"
 #include "network/Document.h"
 #include "hostctl/network/ip/PldNic.h"
+#include "hostctl/network/vswitch/VswitchTables.h"
 #include "hostctl/Lib.h"
 
 namespace PldCtl {
@@ -28,7 +29,6 @@ using Store::Transaction;
 
 namespace {
 
-const char* const kCdpWords[] = {"down", "listen", "advertise", "both"};
 constexpr const char* kDefaultSwitchClass = "stdswitch";
 constexpr int kDefaultMtu = 1500;
 constexpr int kMaxNameLength = 32;
@@ -274,7 +274,7 @@ std::string VirtualSwitchImpl::GetCDPStatus() const {
 void VirtualSwitchImpl::SetCDPStatus(int index) {
     if (index < 0 || index > 3) throw HostCtlException("Invalid CDP status index " + std::to_string(index));
     Refresh(ChangeSwitch("VirtualSwitchImpl::SetCDPStatus", GetName(),
-                         [&](Transaction&, Json& s) { s["cdp"] = kCdpWords[index]; }));
+                         [&](Transaction&, Json& s) { s["cdp"] = HostCtl::Network::kCdpStatusWords[static_cast<std::size_t>(index)]; }));
 }
 
 bool VirtualSwitchImpl::IsBeaconEnabled() const {
@@ -615,7 +615,7 @@ std::unique_ptr<VirtualSwitch> VirtualSwitchInfoImpl::AddVirtualSwitchWithPolicy
         if (t.Exists("vswitches", name) || t.Exists("dvswitches", name)) {
             throw HostCtlException("A virtual switch with the name " + name + " already exists");
         }
-        const std::int64_t limit = t.GetSingleton("system").value("maxPorts", std::int64_t(4608));
+        const std::int64_t limit = t.GetSingleton("system").value("maxPorts", HostCtl::Network::kMaxHostPorts);
         const std::int64_t allocated = t.SumField("vswitches", "numPorts", HostCtl::Network::Portset::DEF_NUM_PORTS) +
                                        t.SumField("dvswitches", "numPorts", HostCtl::Network::Portset::DEF_NUM_PORTS);
         if (allocated + numPorts > limit) {
