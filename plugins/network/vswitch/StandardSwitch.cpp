@@ -3,12 +3,13 @@
 #include <memory>
 
 #include "common/CommandSupport.h"
+#include "hostctl/network/vswitch/VswitchTables.h"
 
 namespace OrvixCli {
 namespace NetworkNamespace {
 
 std::string UnknownSwitchMessage(const std::string& vswitchName) {
-    return "Unable to find virtual switch with the name " + vswitchName;
+    return HostCtl::Network::UnknownVirtualSwitchMessage(vswitchName);
 }
 
 void ChangeStandardSwitch(const boost::shared_ptr<CallSpec::Output>& output, const std::string& vswitchName,

@@ -1,6 +1,7 @@
 #include "vswitch/VswitchLookup.h"
 
 #include "hostctl/network/vswitch/SwitchImpl.h"
+#include "hostctl/network/vswitch/VswitchTables.h"
 
 namespace OrvixCli {
 namespace NetworkNamespace {
@@ -48,7 +49,7 @@ std::unique_ptr<HostCtl::Network::VirtualSwitch> FindLegacySwitch(const std::str
 
 std::unique_ptr<HostCtl::Network::PortGroup> FindPortGroup(const std::string& name, CallSpec::Output& output) {
     std::unique_ptr<HostCtl::Network::PortGroup> portGroup = HostCtl::Network::NetworkFactory::GetPortGroupByName(name);
-    if (!portGroup) output.SetError("Unable to find a port group with the name " + name);
+    if (!portGroup) output.SetError(HostCtl::Network::UnknownPortGroupMessage(name));
     return portGroup;
 }
 

@@ -36,23 +36,15 @@ constexpr int kMaxPortGroupNameLength = 64;
 // Port ids come in blocks of 2^24, one block a switch.
 constexpr std::int64_t kPortBlock = std::int64_t(1) << 24;
 
-std::string NotFoundSwitch(const std::string& name) {
-    return "Unable to find virtual switch with the name " + name;
-}
-
-std::string NotFoundPortGroup(const std::string& name) {
-    return "Unable to find a port group with the name " + name;
-}
-
 Json RequireSwitch(Transaction& t, const std::string& name) {
     std::optional<Json> vswitch = t.Get("vswitches", name);
-    if (!vswitch) throw HostCtlException(NotFoundSwitch(name));
+    if (!vswitch) throw HostCtlException(HostCtl::Network::UnknownVirtualSwitchMessage(name));
     return *vswitch;
 }
 
 Json RequirePortGroup(Transaction& t, const std::string& name) {
     std::optional<Json> portGroup = t.Get("portgroups", name);
-    if (!portGroup) throw HostCtlException(NotFoundPortGroup(name));
+    if (!portGroup) throw HostCtlException(HostCtl::Network::UnknownPortGroupMessage(name));
     return *portGroup;
 }
 
@@ -469,7 +461,7 @@ const Detail::Document& PortGroupImpl::Stored() const {
     if (!document_) {
         Store::HostStore& store = Detail::EnterOperation("PortGroupImpl::Get", name_);
         std::optional<Json> portGroup = store.Get("portgroups", name_);
-        if (!portGroup) throw HostCtlException(NotFoundPortGroup(name_));
+        if (!portGroup) throw HostCtlException(HostCtl::Network::UnknownPortGroupMessage(name_));
         document_ = Detail::MakeDocument(std::move(*portGroup));
     }
     return *document_;
@@ -479,7 +471,7 @@ std::shared_ptr<Detail::Document> PortGroupImpl::SwitchDocument() const {
     const std::string vswitch = GetVirtualSwitchName();
     Store::HostStore& store = Detail::EnterOperation("PortGroupImpl::GetVirtualSwitch", name_);
     std::optional<Json> stored = store.Get("vswitches", vswitch);
-    if (!stored) throw HostCtlException(NotFoundSwitch(vswitch));
+    if (!stored) throw HostCtlException(HostCtl::Network::UnknownVirtualSwitchMessage(vswitch));
     return Detail::MakeDocument(std::move(*stored));
 }
 

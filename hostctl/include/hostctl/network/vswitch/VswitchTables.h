@@ -1,9 +1,11 @@
-// Tables of standard switching that both the library and its callers use:
-// a command offers the words the library stores, so the two cannot drift.
+// Tables and messages of standard switching that both the library and its
+// callers use: a command offers the words the library stores and reports a
+// missing object in the library's words, so the two cannot drift.
 #pragma once
 
 #include <array>
 #include <cstdint>
+#include <string>
 
 namespace HostCtl {
 namespace Network {
@@ -15,6 +17,14 @@ inline constexpr std::array<const char*, 4> kCdpStatusWords = {"down", "listen",
 // The ports all switches of a host may have together, unless the host's
 // system settings say otherwise ("maxPorts").
 inline constexpr std::int64_t kMaxHostPorts = 4608;
+
+// The messages for a standard switch or port group the host does not have.
+inline std::string UnknownVirtualSwitchMessage(const std::string& name) {
+    return "Unable to find virtual switch with the name " + name;
+}
+inline std::string UnknownPortGroupMessage(const std::string& name) {
+    return "Unable to find a port group with the name " + name;
+}
 
 }  // namespace Network
 }  // namespace HostCtl
