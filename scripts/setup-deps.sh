@@ -9,6 +9,7 @@ packages=(
   libboost-dev
   libsqlite3-dev nlohmann-json3-dev
   libgtest-dev libgmock-dev
+  clang-format
 )
 
 missing=()
