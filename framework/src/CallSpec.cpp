@@ -53,6 +53,34 @@ void ParameterConstraint::SetStringRegex(const std::string& pattern) {
     regex_ = pattern;
 }
 
+boost::shared_ptr<ParameterConstraint> IntRange(std::int64_t min, std::int64_t max) {
+    boost::shared_ptr<ParameterConstraint> constraint = ParameterConstraint::New(CONSTRAINT_INT_RANGE);
+    constraint->SetIntRange(min, max);
+    return constraint;
+}
+
+boost::shared_ptr<ParameterConstraint> IntEnum(const std::vector<std::int64_t>& values) {
+    if (values.empty()) throw std::invalid_argument("IntEnum: no values");
+    boost::shared_ptr<ParameterConstraint> constraint = ParameterConstraint::New(CONSTRAINT_INT_ENUM);
+    for (std::int64_t value : values) constraint->AddIntEnum(value);
+    return constraint;
+}
+
+boost::shared_ptr<ParameterConstraint> StringEnum(const std::vector<ParameterConstraint::StringEnumValue>& values) {
+    if (values.empty()) throw std::invalid_argument("StringEnum: no values");
+    boost::shared_ptr<ParameterConstraint> constraint = ParameterConstraint::New(CONSTRAINT_STRING_ENUM);
+    for (const ParameterConstraint::StringEnumValue& value : values) {
+        constraint->AddStringEnum(value.value, value.description);
+    }
+    return constraint;
+}
+
+boost::shared_ptr<ParameterConstraint> StringRegex(const std::string& pattern) {
+    boost::shared_ptr<ParameterConstraint> constraint = ParameterConstraint::New(CONSTRAINT_STRING_REGEX);
+    constraint->SetStringRegex(pattern);
+    return constraint;
+}
+
 boost::shared_ptr<ParameterSpec> ParameterSpec::New(const std::string& name, ParameterType type) {
     if (name.empty()) throw std::invalid_argument("ParameterSpec::New: empty parameter name");
     if (type < PARAM_STRING || type > PARAM_FLAG) {

@@ -59,7 +59,10 @@ CommandLine Resolve(const boost::shared_ptr<NamespaceNode>& root, const std::vec
                 line.formatter = token.substr(12);
             } else if (i + 1 < args.size() && !IsOption(args[i + 1])) {
                 line.formatter = args[++i];
-            } else {
+            }
+            // An empty name would otherwise pass as "no formatter chosen" and
+            // print in the default format a script did not ask for.
+            if (line.formatter.empty()) {
                 throw UsageError("Option --formatter needs a value: one of " + FormatterList());
             }
         } else if (command) {

@@ -8,9 +8,10 @@ namespace {
 
 using CallSpec::ParameterConstraint;
 using CallSpec::ParameterSpec;
+using CallSpec::Required;
 
 boost::shared_ptr<ParameterSpec> Param(
-    const std::string& name, CallSpec::ParameterType type, const std::string& letter, bool required = false,
+    const std::string& name, CallSpec::ParameterType type, const std::string& letter, Required required = Required::No,
     boost::shared_ptr<ParameterConstraint> c = boost::shared_ptr<ParameterConstraint>()) {
     auto p = ParameterSpec::New(name, type);
     p->SetShortName(letter);
@@ -19,27 +20,25 @@ boost::shared_ptr<ParameterSpec> Param(
     return p;
 }
 
-// A declared like a real command's: a required string, an int range, a bool, a
-// flag, a string enum and a regex.
+const char kInterfacePattern[] = "pld([0-9]|[1-9][0-9]|1[0-9][0-9]|2[0-4][0-9]|25[0-5])";
+
+// A declaration like a real command's, its constraints built by the
+// framework's factories: a required string, an int range, a bool, a flag, a
+// string enum, a regex and an int enum.
 boost::shared_ptr<CallSpec::InputSpec> SampleSpec() {
     auto declared = CallSpec::InputSpec::New();
-    declared->AddParameter(Param("vswitch-name", CallSpec::PARAM_STRING, "v", true));
-    auto range = ParameterConstraint::New(CallSpec::CONSTRAINT_INT_RANGE);
-    range->SetIntRange(1, 4096);
-    declared->AddParameter(Param("ports", CallSpec::PARAM_INT, "P", false, range));
+    declared->AddParameter(Param("vswitch-name", CallSpec::PARAM_STRING, "v", Required::Yes));
+    declared->AddParameter(Param("ports", CallSpec::PARAM_INT, "P", Required::No, CallSpec::IntRange(1, 4096)));
     declared->AddParameter(Param("enabled", CallSpec::PARAM_BOOL, "e"));
     declared->AddParameter(Param("use-vswitch", CallSpec::PARAM_FLAG, "u"));
-    auto cdp = ParameterConstraint::New(CallSpec::CONSTRAINT_STRING_ENUM);
-    for (const char* w : {"down", "listen", "advertise", "both"}) cdp->AddStringEnum(w, "");
-    declared->AddParameter(Param("cdp-status", CallSpec::PARAM_STRING, "c", false, cdp));
-    auto name = ParameterConstraint::New(CallSpec::CONSTRAINT_STRING_REGEX);
-    name->SetStringRegex("pld([0-9]|[1-9][0-9]|1[0-9][0-9]|2[0-4][0-9]|25[0-5])");
-    declared->AddParameter(Param("interface-name", CallSpec::PARAM_STRING, "i", false, name));
+    declared->AddParameter(
+        Param("cdp-status", CallSpec::PARAM_STRING, "c", Required::No,
+              CallSpec::StringEnum(
+                  {{"down", "Down"}, {"listen", "Listen only"}, {"advertise", ""}, {"both", "Listen and advertise"}})));
+    declared->AddParameter(
+        Param("interface-name", CallSpec::PARAM_STRING, "i", Required::No, CallSpec::StringRegex(kInterfacePattern)));
     declared->AddParameter(Param("mtu", CallSpec::PARAM_INT, "m"));
-    auto levels = ParameterConstraint::New(CallSpec::CONSTRAINT_INT_ENUM);
-    levels->AddIntEnum(1);
-    levels->AddIntEnum(3);
-    declared->AddParameter(Param("level", CallSpec::PARAM_INT, "l", false, levels));
+    declared->AddParameter(Param("level", CallSpec::PARAM_INT, "l", Required::No, CallSpec::IntEnum({1, 3})));
     return declared;
 }
 
@@ -124,11 +123,9 @@ TEST(Parser, RefusesBadCommandLinesWithOneLineMessages) {
          "'listen'?"},
         // The regex must match the whole value, not a part of it.
         {{"-v", "a", "--interface-name=pld256"},
-         "Invalid value 'pld256' for --interface-name: it must match "
-         "pld([0-9]|[1-9][0-9]|1[0-9][0-9]|2[0-4][0-9]|25[0-5])"},
+         std::string("Invalid value 'pld256' for --interface-name: it must match ") + kInterfacePattern},
         {{"-v", "a", "--interface-name=xpld1"},
-         "Invalid value 'xpld1' for --interface-name: it must match "
-         "pld([0-9]|[1-9][0-9]|1[0-9][0-9]|2[0-4][0-9]|25[0-5])"},
+         std::string("Invalid value 'xpld1' for --interface-name: it must match ") + kInterfacePattern},
     };
     for (const auto& c : cases) {
         std::string line;
@@ -145,9 +142,43 @@ TEST(Parser, SpecRefusesClashingDeclarations) {
     EXPECT_THROW(declared->AddParameter(Param("vswitch-name", CallSpec::PARAM_STRING, "x")), std::invalid_argument);
     EXPECT_THROW(declared->AddParameter(Param("vlan-id", CallSpec::PARAM_INT, "v")), std::invalid_argument);
     EXPECT_THROW(ParameterSpec::New("p", CallSpec::PARAM_INT)->SetShortName("ab"), std::invalid_argument);
-    EXPECT_THROW(ParameterConstraint::New(CallSpec::CONSTRAINT_STRING_REGEX)->SetStringRegex("pld("),
-                 std::invalid_argument);
-    EXPECT_THROW(ParameterConstraint::New(CallSpec::CONSTRAINT_INT_RANGE)->SetIntRange(5, 1), std::invalid_argument);
+}
+
+// A constraint no value could meet, or one that cannot be checked, is a
+// mistake in the declaration: it is refused when the command declares it,
+// not discovered by a user.
+TEST(ConstraintFactories, RefuseConstraintsThatCannotWork) {
+    EXPECT_THROW(CallSpec::IntRange(5, 1), std::invalid_argument);
+    EXPECT_THROW(CallSpec::IntEnum({}), std::invalid_argument);
+    EXPECT_THROW(CallSpec::StringEnum({}), std::invalid_argument);
+    EXPECT_THROW(CallSpec::StringRegex("pld("), std::invalid_argument);
+    // A range of one value and the widest range are fine.
+    EXPECT_NO_THROW(CallSpec::IntRange(7, 7));
+    EXPECT_NO_THROW(CallSpec::IntRange(INT64_MIN, INT64_MAX));
+}
+
+TEST(ConstraintFactories, EnumsExpandInHelpInTheirDeclaredOrder) {
+    auto cdp = SampleSpec()->FindByName("cdp-status");
+    cdp->SetDescription("One of %ENUM%:%FULLENUM%");
+    EXPECT_EQ(AutoCli::ExpandDescription(*cdp, "  "),
+              "One of down, listen, advertise, both:\n  down: Down\n  listen: Listen only\n  advertise\n  both: "
+              "Listen and advertise");
+    auto level = SampleSpec()->FindByName("level");
+    level->SetDescription("%ENUM% (%FULLENUM%)");
+    EXPECT_EQ(AutoCli::ExpandDescription(*level, "-"), "1, 3 (\n-1\n-3)");
+}
+
+TEST(ConstraintFactories, ARangeAdmitsItsBoundsAndNamesThemWhenRefusing) {
+    auto declared = CallSpec::InputSpec::New();
+    declared->AddParameter(Param("delta", CallSpec::PARAM_INT, "d", Required::No, CallSpec::IntRange(-5, INT64_MAX)));
+    EXPECT_EQ(AutoCli::ParseArguments(*declared, {"-d", "-5"})->GetInt("delta"), -5);
+    EXPECT_EQ(AutoCli::ParseArguments(*declared, {"-d", "9223372036854775807"})->GetInt("delta"), INT64_MAX);
+    try {
+        AutoCli::ParseArguments(*declared, {"--delta=-6"});
+        ADD_FAILURE() << "-6 accepted";
+    } catch (const AutoCli::UsageError& e) {
+        EXPECT_STREQ(e.what(), "Value -6 for --delta is out of range: it must be between -5 and 9223372036854775807");
+    }
 }
 
 TEST(Parser, SuggestsOnlyCloseWords) {

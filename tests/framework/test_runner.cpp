@@ -169,6 +169,8 @@ TEST(Runner, RefusesBadCommandLines) {
          "tool: Unknown formatter 'jsno'. Did you mean 'json'? Formatters: simple, table, json, xml, csv, keyvalue\n"},
         {{"top", "list", "-n", "alpha", "--formatter"},
          "tool: Option --formatter needs a value: one of simple, table, json, xml, csv, keyvalue\n"},
+        {{"top", "list", "-n", "alpha", "--formatter="},
+         "tool: Option --formatter needs a value: one of simple, table, json, xml, csv, keyvalue\n"},
         {{"top", "list", "-n", "gamma"},
          "tool: Invalid value 'gamma' for --name: it must be one of alpha, beta\n"
          "Run 'tool top list --help' for its options.\n"},

@@ -68,6 +68,24 @@ private:
     std::string regex_;
 };
 
+// Whether a command line must give a parameter. A declaration names it, so
+// that it reads as what it means rather than as a bare true or false.
+enum class Required : bool { No = false, Yes = true };
+
+// The constraint vocabulary every declaration builds its checks from, one
+// factory a kind. Each returns a new constraint that the caller attaches
+// with ParameterSpec::SetConstraint. They throw std::invalid_argument for a
+// constraint no value could meet or no check could apply: an IntRange whose
+// min is above its max, an enum without values, a pattern that does not
+// compile.
+boost::shared_ptr<ParameterConstraint> IntRange(std::int64_t min, std::int64_t max);
+boost::shared_ptr<ParameterConstraint> IntEnum(const std::vector<std::int64_t>& values);
+// The values in the order help lists them, each with its own description
+// (which %FULLENUM% shows after the value; it may be empty).
+boost::shared_ptr<ParameterConstraint> StringEnum(const std::vector<ParameterConstraint::StringEnumValue>& values);
+// A pattern the whole value must match (ECMAScript syntax).
+boost::shared_ptr<ParameterConstraint> StringRegex(const std::string& pattern);
+
 class ParameterSpec {
 public:
     static boost::shared_ptr<ParameterSpec> New(const std::string& name, ParameterType type);
@@ -77,9 +95,8 @@ public:
     void SetShortName(char letter);
     void SetDescription(const std::string& description) { description_ = description; }
     void SetRequired(bool required) { required_ = required; }
-    void SetConstraint(const boost::shared_ptr<ParameterConstraint>& constraint) {
-        constraint_ = constraint;
-    }
+    void SetRequired(Required required) { required_ = required == Required::Yes; }
+    void SetConstraint(const boost::shared_ptr<ParameterConstraint>& constraint) { constraint_ = constraint; }
 
     const std::string& GetName() const { return name_; }
     ParameterType GetType() const { return type_; }

@@ -5,7 +5,7 @@ namespace NetworkNamespace {
 
 void DeclareParameter(const boost::shared_ptr<CallSpec::InputSpec>& inputSpec, const std::string& name,
                       CallSpec::ParameterType type, const std::string& shortName, const std::string& description,
-                      bool required, const boost::shared_ptr<CallSpec::ParameterConstraint>& constraint) {
+                      Required required, const boost::shared_ptr<CallSpec::ParameterConstraint>& constraint) {
     boost::shared_ptr<CallSpec::ParameterSpec> parameter = CallSpec::ParameterSpec::New(name, type);
     parameter->SetShortName(shortName);
     parameter->SetDescription(description);

@@ -13,12 +13,20 @@
 namespace OrvixCli {
 namespace NetworkNamespace {
 
-// Declares one parameter in the fixed order: ParameterSpec::New,
+// The framework's declaration vocabulary, so that a declaration reads
+// `Required::No, IntRange(1, Portset::MAX_NUM_PORTS)`.
+using CallSpec::IntEnum;
+using CallSpec::IntRange;
+using CallSpec::Required;
+using CallSpec::StringEnum;
+using CallSpec::StringRegex;
+
+// Declares one parameter in one line, in the fixed order: ParameterSpec::New,
 // SetShortName, SetDescription, SetRequired, SetConstraint (when there is
-// one), AddParameter. The constraint is built by the caller beforehand.
+// one), AddParameter. The constraint comes from one of the factories above.
 void DeclareParameter(const boost::shared_ptr<CallSpec::InputSpec>& inputSpec, const std::string& name,
                       CallSpec::ParameterType type, const std::string& shortName, const std::string& description,
-                      bool required,
+                      Required required,
                       const boost::shared_ptr<CallSpec::ParameterConstraint>& constraint =
                           boost::shared_ptr<CallSpec::ParameterConstraint>());
 

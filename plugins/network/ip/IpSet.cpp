@@ -16,7 +16,7 @@ ORVIX_COMMAND_NEW(IpSet)
 boost::shared_ptr<CallSpec::InputSpec> IpSet::GetInputSpecInternal() {
     boost::shared_ptr<CallSpec::InputSpec> declared = CallSpec::InputSpec::New();
     DeclareParameter(declared, "ipv6-enabled", CallSpec::PARAM_BOOL, "e", "Enable or disable IPv6 (Reboot Required)",
-                     false);
+                     Required::No);
     return declared;
 }
 

@@ -1,7 +1,7 @@
 #include "vswitch/VirtualSwitchPortGroupAdd.h"
 
 #include "common/CommandSupport.h"
-#include "vswitch/StandardSwitch.h"
+#include "vswitch/VswitchLookup.h"
 
 namespace OrvixCli {
 namespace NetworkNamespace {
@@ -16,9 +16,9 @@ ORVIX_COMMAND_NEW(VirtualSwitchPortGroupAdd)
 boost::shared_ptr<CallSpec::InputSpec> VirtualSwitchPortGroupAdd::GetInputSpecInternal() {
     boost::shared_ptr<CallSpec::InputSpec> declared = CallSpec::InputSpec::New();
     DeclareParameter(declared, "portgroup-name", CallSpec::PARAM_STRING, "p", "The name of the port group to add",
-                     true);
+                     Required::Yes);
     DeclareParameter(declared, "vswitch-name", CallSpec::PARAM_STRING, "v",
-                     "The virtual switch to add the port group to.", true);
+                     "The virtual switch to add the port group to.", Required::Yes);
     return declared;
 }
 

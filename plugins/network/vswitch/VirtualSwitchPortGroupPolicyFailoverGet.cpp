@@ -1,7 +1,8 @@
 #include "vswitch/VirtualSwitchPortGroupPolicyFailoverGet.h"
 
-#include "vswitch/VswitchRecords.h"
 #include "vswitch/VswitchLookup.h"
+#include "vswitch/VswitchOptions.h"
+#include "vswitch/VswitchRecords.h"
 
 namespace OrvixCli {
 namespace NetworkNamespace {

@@ -3,8 +3,8 @@
 #include <string>
 #include <vector>
 
-#include "vswitch/VswitchOptions.h"
 #include "vswitch/VswitchLookup.h"
+#include "vswitch/VswitchOptions.h"
 
 namespace OrvixCli {
 namespace NetworkNamespace {

@@ -1,7 +1,8 @@
 #include "vswitch/VirtualSwitchPortGroupPolicySecurityGet.h"
 
-#include "vswitch/VswitchRecords.h"
 #include "vswitch/VswitchLookup.h"
+#include "vswitch/VswitchOptions.h"
+#include "vswitch/VswitchRecords.h"
 
 namespace OrvixCli {
 namespace NetworkNamespace {

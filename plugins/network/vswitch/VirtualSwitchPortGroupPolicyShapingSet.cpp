@@ -1,7 +1,7 @@
 #include "vswitch/VirtualSwitchPortGroupPolicyShapingSet.h"
 
-#include "vswitch/VswitchOptions.h"
 #include "vswitch/VswitchLookup.h"
+#include "vswitch/VswitchOptions.h"
 
 namespace OrvixCli {
 namespace NetworkNamespace {

@@ -1,7 +1,7 @@
 #include "vswitch/VirtualSwitchPortGroupRemove.h"
 
 #include "common/CommandSupport.h"
-#include "vswitch/StandardSwitch.h"
+#include "vswitch/VswitchLookup.h"
 
 namespace OrvixCli {
 namespace NetworkNamespace {
@@ -15,8 +15,8 @@ ORVIX_COMMAND_NEW(VirtualSwitchPortGroupRemove)
 
 boost::shared_ptr<CallSpec::InputSpec> VirtualSwitchPortGroupRemove::GetInputSpecInternal() {
     boost::shared_ptr<CallSpec::InputSpec> declared = CallSpec::InputSpec::New();
-    DeclareParameter(declared, "portgroup-name", CallSpec::PARAM_STRING, "p", " ", true);
-    DeclareParameter(declared, "vswitch-name", CallSpec::PARAM_STRING, "v", " ", true);
+    DeclareParameter(declared, "portgroup-name", CallSpec::PARAM_STRING, "p", " ", Required::Yes);
+    DeclareParameter(declared, "vswitch-name", CallSpec::PARAM_STRING, "v", " ", Required::Yes);
     return declared;
 }
 

@@ -16,18 +16,15 @@ ORVIX_COMMAND_NEW(VirtualSwitchPortGroupSet)
 boost::shared_ptr<CallSpec::InputSpec> VirtualSwitchPortGroupSet::GetInputSpecInternal() {
     boost::shared_ptr<CallSpec::InputSpec> declared = CallSpec::InputSpec::New();
     DeclareParameter(declared, "portgroup-name", CallSpec::PARAM_STRING, "p",
-                     "The name of the port group to set vlan id for.", true);
+                     "The name of the port group to set vlan id for.", Required::Yes);
     // The help text and the check are made from the same two library
     // constants, so they cannot disagree.
     const unsigned minVlan = HostCtl::Network::PortGroup::MIN_VLAN_ID;
     const unsigned maxVlan = HostCtl::Network::PortGroup::MAX_VLAN_ID;
-    boost::shared_ptr<CallSpec::ParameterConstraint> vlanRange =
-        CallSpec::ParameterConstraint::New(CallSpec::CONSTRAINT_INT_RANGE);
-    vlanRange->SetIntRange(minVlan, maxVlan);
     DeclareParameter(declared, "vlan-id", CallSpec::PARAM_INT, "v",
                      "The vlan id for this port group. This value is in the range (" + std::to_string(minVlan) + " - " +
                          std::to_string(maxVlan) + ")",
-                     false, vlanRange);
+                     Required::No, IntRange(minVlan, maxVlan));
     return declared;
 }
 

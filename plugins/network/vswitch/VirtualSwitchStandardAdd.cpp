@@ -2,6 +2,7 @@
 
 #include "common/CommandSupport.h"
 #include "hostctl/network/vswitch/SwitchImpl.h"
+#include "hostctl/network/vswitch/VswitchTables.h"
 
 namespace OrvixCli {
 namespace NetworkNamespace {
@@ -18,18 +19,19 @@ ORVIX_COMMAND_NEW(VirtualSwitchStandardAdd)
 boost::shared_ptr<CallSpec::InputSpec> VirtualSwitchStandardAdd::GetInputSpecInternal() {
     boost::shared_ptr<CallSpec::InputSpec> declared = CallSpec::InputSpec::New();
     DeclareParameter(declared, "vswitch-name", CallSpec::PARAM_STRING, "v", "The name of the virtual switch to create.",
-                     true);
+                     Required::Yes);
     // Only the per-switch bound is checked here; the host-wide limit depends
-    // on the other switches and is the library's to enforce.
-    boost::shared_ptr<CallSpec::ParameterConstraint> portRange =
-        CallSpec::ParameterConstraint::New(CallSpec::CONSTRAINT_INT_RANGE);
-    portRange->SetIntRange(1, Portset::MAX_NUM_PORTS);
+    // on the other switches and is the library's to enforce. The numbers in
+    // the help are the library's own, so the text cannot drift from them.
     DeclareParameter(declared, "ports", CallSpec::PARAM_INT, "P",
                      "The number of ports to to give this newly created virtual switch. Maximum ports per virtual "
-                     "switch is 4096. If no value is given the default value(128) is used. The number of ports is "
-                     "limited by the number of already allocated ports on the host. The system wide port count "
-                     "cannot be greater than 4608.",
-                     false, portRange);
+                     "switch is " +
+                         std::to_string(Portset::MAX_NUM_PORTS) + ". If no value is given the default value(" +
+                         std::to_string(Portset::DEF_NUM_PORTS) +
+                         ") is used. The number of ports is limited by the number of already allocated ports on the "
+                         "host. The system wide port count cannot be greater than " +
+                         std::to_string(HostCtl::Network::kMaxHostPorts) + ".",
+                     Required::No, IntRange(1, Portset::MAX_NUM_PORTS));
     return declared;
 }
 

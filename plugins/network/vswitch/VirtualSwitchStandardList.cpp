@@ -66,7 +66,7 @@ ORVIX_COMMAND_NEW(VirtualSwitchStandardList)
 boost::shared_ptr<CallSpec::InputSpec> VirtualSwitchStandardList::GetInputSpecInternal() {
     boost::shared_ptr<CallSpec::InputSpec> declared = CallSpec::InputSpec::New();
     DeclareParameter(declared, "vswitch-name", CallSpec::PARAM_STRING, "v",
-                     "Limit the output of this command to only virtual switches with the given name.", false);
+                     "Limit the output of this command to only virtual switches with the given name.", Required::No);
     return declared;
 }
 

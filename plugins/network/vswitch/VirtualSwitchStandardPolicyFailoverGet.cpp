@@ -1,7 +1,8 @@
 #include "vswitch/VirtualSwitchStandardPolicyFailoverGet.h"
 
-#include "vswitch/VswitchRecords.h"
 #include "vswitch/VswitchLookup.h"
+#include "vswitch/VswitchOptions.h"
+#include "vswitch/VswitchRecords.h"
 
 namespace OrvixCli {
 namespace NetworkNamespace {
@@ -27,7 +28,7 @@ boost::shared_ptr<MetaObj::MetaStruct> VirtualSwitchStandardPolicyFailoverGet::G
 
 void VirtualSwitchStandardPolicyFailoverGet::ExecuteInternal(boost::shared_ptr<CallSpec::Input> input,
                                                              boost::shared_ptr<CallSpec::Output> output) {
-    OnLegacySwitch(input, output, [&](HostCtl::Network::VirtualSwitch& vswitch) {
+    OnSwitch(SwitchLookup::Legacy, input, output, [&](HostCtl::Network::VirtualSwitch& vswitch) {
         boost::shared_ptr<MetaObj::MetaStruct> record = GetOutputStructure();
         FillPolicyFields(*record, vswitch.GetTeamingPolicy(), vswitch.GetUplinks());
         Finish(output, record);

@@ -3,8 +3,8 @@
 #include <string>
 #include <vector>
 
-#include "vswitch/VswitchOptions.h"
 #include "vswitch/VswitchLookup.h"
+#include "vswitch/VswitchOptions.h"
 
 namespace OrvixCli {
 namespace NetworkNamespace {
@@ -29,7 +29,7 @@ boost::shared_ptr<CallSpec::OutputSpec> VirtualSwitchStandardPolicyFailoverSet::
 
 void VirtualSwitchStandardPolicyFailoverSet::ExecuteInternal(boost::shared_ptr<CallSpec::Input> input,
                                                              boost::shared_ptr<CallSpec::Output> output) {
-    OnLegacySwitch(input, output, [&](HostCtl::Network::VirtualSwitch& vswitch) {
+    OnSwitch(SwitchLookup::Legacy, input, output, [&](HostCtl::Network::VirtualSwitch& vswitch) {
         // The policy shown is the reference for the adapters the options
         // leave out; the configured one is what is written back.
         HostCtl::Network::NicTeamingPolicy shown = vswitch.GetTeamingPolicy();

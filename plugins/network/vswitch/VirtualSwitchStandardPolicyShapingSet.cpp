@@ -1,7 +1,7 @@
 #include "vswitch/VirtualSwitchStandardPolicyShapingSet.h"
 
-#include "vswitch/VswitchOptions.h"
 #include "vswitch/VswitchLookup.h"
+#include "vswitch/VswitchOptions.h"
 
 namespace OrvixCli {
 namespace NetworkNamespace {
@@ -26,7 +26,7 @@ boost::shared_ptr<CallSpec::OutputSpec> VirtualSwitchStandardPolicyShapingSet::G
 
 void VirtualSwitchStandardPolicyShapingSet::ExecuteInternal(boost::shared_ptr<CallSpec::Input> input,
                                                             boost::shared_ptr<CallSpec::Output> output) {
-    OnLegacySwitch(input, output, [&](HostCtl::Network::VirtualSwitch& vswitch) {
+    OnSwitch(SwitchLookup::Legacy, input, output, [&](HostCtl::Network::VirtualSwitch& vswitch) {
         HostCtl::Network::ShapingPolicy policy = vswitch.GetShapingPolicy();
         SetShapingPolicy(input, output, policy, false);
         WriteUnlessRefused(output, [&] { vswitch.SetShapingPolicy(policy); });

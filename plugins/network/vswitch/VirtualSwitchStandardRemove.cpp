@@ -1,8 +1,8 @@
 #include "vswitch/VirtualSwitchStandardRemove.h"
 
 #include "common/CommandSupport.h"
-#include "vswitch/StandardSwitch.h"
 #include "hostctl/network/vswitch/SwitchImpl.h"
+#include "hostctl/network/vswitch/VswitchTables.h"
 
 namespace OrvixCli {
 namespace NetworkNamespace {
@@ -17,7 +17,7 @@ ORVIX_COMMAND_NEW(VirtualSwitchStandardRemove)
 boost::shared_ptr<CallSpec::InputSpec> VirtualSwitchStandardRemove::GetInputSpecInternal() {
     boost::shared_ptr<CallSpec::InputSpec> declared = CallSpec::InputSpec::New();
     DeclareParameter(declared, "vswitch-name", CallSpec::PARAM_STRING, "v", "The name of the virtual switch to remove.",
-                     true);
+                     Required::Yes);
     return declared;
 }
 
@@ -31,7 +31,7 @@ void VirtualSwitchStandardRemove::ExecuteInternal(boost::shared_ptr<CallSpec::In
     ReportingHostErrors(output, [&] {
         const std::string name = input->GetString("vswitch-name");
         if (!PldCtl::Network::PortsetImpl::IsValidVirtualSwitch(name)) {
-            output->SetError(UnknownSwitchMessage(name));
+            output->SetError(HostCtl::Network::UnknownVirtualSwitchMessage(name));
             return;
         }
         switchInfo.RemoveVirtualSwitch(name);

@@ -1,10 +1,7 @@
 #include "vswitch/VirtualSwitchStandardSet.h"
 
-#include <memory>
-
-#include "vswitch/CdpStatus.h"
-#include "common/CommandSupport.h"
-#include "hostctl/network/vswitch/SwitchImpl.h"
+#include "vswitch/VswitchLookup.h"
+#include "vswitch/VswitchOptions.h"
 
 namespace OrvixCli {
 namespace NetworkNamespace {
@@ -19,11 +16,12 @@ ORVIX_COMMAND_NEW(VirtualSwitchStandardSet)
 boost::shared_ptr<CallSpec::InputSpec> VirtualSwitchStandardSet::GetInputSpecInternal() {
     boost::shared_ptr<CallSpec::InputSpec> declared = CallSpec::InputSpec::New();
     DeclareParameter(declared, "vswitch-name", CallSpec::PARAM_STRING, "v",
-                     "The name of virtual switch to apply the configurations.", true);
-    DeclareParameter(declared, "mtu", CallSpec::PARAM_INT, "m", "The MTU size of the given virtual switch. ", false);
+                     "The name of virtual switch to apply the configurations.", Required::Yes);
+    DeclareParameter(declared, "mtu", CallSpec::PARAM_INT, "m", "The MTU size of the given virtual switch. ",
+                     Required::No);
     DeclareParameter(declared, "cdp-status", CallSpec::PARAM_STRING, "c",
                      "The CDP status of the given virtual switch. It can be 'down', 'listen', 'advertise' or 'both'",
-                     false, CdpStatusConstraint());
+                     Required::No, CdpStatusConstraint());
     return declared;
 }
 
@@ -33,18 +31,7 @@ boost::shared_ptr<CallSpec::OutputSpec> VirtualSwitchStandardSet::GetOutputSpecI
 
 void VirtualSwitchStandardSet::ExecuteInternal(boost::shared_ptr<CallSpec::Input> input,
                                                boost::shared_ptr<CallSpec::Output> output) {
-    PldCtl::Network::VirtualSwitchInfoImpl switchInfo;
-    ReportingHostErrors(output, [&] {
-        const std::string name = input->GetString("vswitch-name");
-        if (!PldCtl::Network::PortsetImpl::IsValidVirtualSwitch(name)) {
-            output->SetError(name + " is not a valid name for a virtual switch");
-            return;
-        }
-        std::unique_ptr<HostCtl::Network::VirtualSwitch> vswitch = switchInfo.GetVirtualSwitchByName(name);
-        if (!vswitch) {
-            output->SetError("Unable to find a virtual switch with name " + name);
-            return;
-        }
+    OnSwitch(SwitchLookup::Settable, input, output, [&](HostCtl::Network::VirtualSwitch& vswitch) {
         if (input->IsSet("mtu")) {
             // The value goes to the switch as it was typed: only the sign is
             // ours to refuse, the range is the library's, and narrowing it
@@ -54,9 +41,9 @@ void VirtualSwitchStandardSet::ExecuteInternal(boost::shared_ptr<CallSpec::Input
                 output->SetError("MTU size should be a positive value");
                 return;
             }
-            vswitch->SetMTU(mtu);
+            vswitch.SetMTU(mtu);
         }
-        if (input->IsSet("cdp-status")) vswitch->SetCDPStatus(CdpStatusIndex(input->GetString("cdp-status")));
+        if (input->IsSet("cdp-status")) vswitch.SetCDPStatus(CdpStatusIndex(input->GetString("cdp-status")));
         FinishTrue(output);
     });
 }

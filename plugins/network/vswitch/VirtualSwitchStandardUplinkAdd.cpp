@@ -1,7 +1,7 @@
 #include "vswitch/VirtualSwitchStandardUplinkAdd.h"
 
 #include "common/CommandSupport.h"
-#include "vswitch/StandardSwitch.h"
+#include "vswitch/VswitchLookup.h"
 
 namespace OrvixCli {
 namespace NetworkNamespace {
@@ -18,9 +18,9 @@ ORVIX_COMMAND_NEW(VirtualSwitchStandardUplinkAdd)
 boost::shared_ptr<CallSpec::InputSpec> VirtualSwitchStandardUplinkAdd::GetInputSpecInternal() {
     boost::shared_ptr<CallSpec::InputSpec> declared = CallSpec::InputSpec::New();
     DeclareParameter(declared, "vswitch-name", CallSpec::PARAM_STRING, "v",
-                     "The name of the virtual switch to add an uplink to.", true);
+                     "The name of the virtual switch to add an uplink to.", Required::Yes);
     DeclareParameter(declared, "uplink-name", CallSpec::PARAM_STRING, "u",
-                     "The name of the uplink to add to the virtual switch.", true);
+                     "The name of the uplink to add to the virtual switch.", Required::Yes);
     return declared;
 }
 

@@ -1,7 +1,7 @@
 #include "vswitch/VirtualSwitchStandardUplinkRemove.h"
 
 #include "common/CommandSupport.h"
-#include "vswitch/StandardSwitch.h"
+#include "vswitch/VswitchLookup.h"
 
 namespace OrvixCli {
 namespace NetworkNamespace {
@@ -18,9 +18,9 @@ ORVIX_COMMAND_NEW(VirtualSwitchStandardUplinkRemove)
 boost::shared_ptr<CallSpec::InputSpec> VirtualSwitchStandardUplinkRemove::GetInputSpecInternal() {
     boost::shared_ptr<CallSpec::InputSpec> declared = CallSpec::InputSpec::New();
     DeclareParameter(declared, "vswitch-name", CallSpec::PARAM_STRING, "v",
-                     "The name of the virtual switch to remove an uplink from.", true);
+                     "The name of the virtual switch to remove an uplink from.", Required::Yes);
     DeclareParameter(declared, "uplink-name", CallSpec::PARAM_STRING, "u",
-                     "The name of the uplink to remove from the virtual switch.", true);
+                     "The name of the uplink to remove from the virtual switch.", Required::Yes);
     return declared;
 }
 

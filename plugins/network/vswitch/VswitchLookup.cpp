@@ -8,42 +8,57 @@ namespace NetworkNamespace {
 
 namespace {
 
-boost::shared_ptr<CallSpec::InputSpec> NameInput(const std::string& name, const std::string& shortName,
-                                                 const std::string& description) {
-    boost::shared_ptr<CallSpec::InputSpec> declared = CallSpec::InputSpec::New();
-    DeclareParameter(declared, name, CallSpec::PARAM_STRING, shortName, description, true);
-    return declared;
+using Message = std::string (*)(const std::string& name);
+
+std::string NoLegacySwitch(const std::string& name) {
+    return "Unable to find a legacy virtual switch with the name " + name;
+}
+
+std::string NotASwitchName(const std::string& name) {
+    return name + " is not a valid name for a virtual switch";
+}
+
+std::string NoSwitchToSet(const std::string& name) {
+    return "Unable to find a virtual switch with name " + name;
+}
+
+// One way of finding a switch: whether it asks the factory, and the
+// messages for a name the host does not know and for a switch that cannot
+// be read (the factory has only the second).
+struct Way {
+    bool byId;
+    Message unknownName;
+    Message notFound;
+};
+
+Way WayOf(SwitchLookup how) {
+    switch (how) {
+        case SwitchLookup::Legacy:
+            return {false, NoLegacySwitch, NoLegacySwitch};
+        case SwitchLookup::ById:
+            return {true, nullptr, HostCtl::Network::UnknownVirtualSwitchMessage};
+        case SwitchLookup::Settable:
+            return {false, NotASwitchName, NoSwitchToSet};
+    }
+    return {true, nullptr, HostCtl::Network::UnknownVirtualSwitchMessage};
 }
 
 }  // namespace
 
-boost::shared_ptr<CallSpec::InputSpec> VswitchNameInput(const std::string& description) {
-    return NameInput("vswitch-name", "v", description);
-}
-
-boost::shared_ptr<CallSpec::InputSpec> PortGroupNameInput(const std::string& description) {
-    return NameInput("portgroup-name", "p", description);
-}
-
-boost::shared_ptr<CallSpec::InputSpec> PortGroupPolicySetInput(const std::string& description,
-                                                               int blanksBetweenSentences) {
-    boost::shared_ptr<CallSpec::InputSpec> declared = PortGroupNameInput(description);
-    DeclareParameter(declared, "use-vswitch", CallSpec::PARAM_FLAG, "u",
-                     "Reset all values for this policy to use parent virtual switch's settings instead of overriding "
-                     "the settings for the port group." +
-                         std::string(static_cast<std::size_t>(blanksBetweenSentences), ' ') +
-                         "Using this in conjunction with other settings will first reset all of the fields to use the "
-                         "virtual switch setting and then apply the other options after the reset.",
-                     false);
-    return declared;
-}
-
-std::unique_ptr<HostCtl::Network::VirtualSwitch> FindLegacySwitch(const std::string& name, CallSpec::Output& output) {
-    PldCtl::Network::VirtualSwitchInfoImpl switchInfo;
+std::unique_ptr<HostCtl::Network::VirtualSwitch> FindSwitch(SwitchLookup how, const std::string& name,
+                                                            CallSpec::Output& output) {
+    const Way way = WayOf(how);
     std::unique_ptr<HostCtl::Network::VirtualSwitch> vswitch;
-    // A name the host does not know is not looked up at all.
-    if (PldCtl::Network::PortsetImpl::IsValidVirtualSwitch(name)) vswitch = switchInfo.GetVirtualSwitchByName(name);
-    if (!vswitch) output.SetError("Unable to find a legacy virtual switch with the name " + name);
+    if (way.byId) {
+        vswitch = HostCtl::Network::NetworkFactory::GetVirtualSwitchById(name);
+    } else if (!PldCtl::Network::PortsetImpl::IsValidVirtualSwitch(name)) {
+        // A name the host does not know is not read at all.
+        output.SetError(way.unknownName(name));
+        return vswitch;
+    } else {
+        vswitch = PldCtl::Network::VirtualSwitchInfoImpl().GetVirtualSwitchByName(name);
+    }
+    if (!vswitch) output.SetError(way.notFound(name));
     return vswitch;
 }
 
@@ -51,6 +66,17 @@ std::unique_ptr<HostCtl::Network::PortGroup> FindPortGroup(const std::string& na
     std::unique_ptr<HostCtl::Network::PortGroup> portGroup = HostCtl::Network::NetworkFactory::GetPortGroupByName(name);
     if (!portGroup) output.SetError(HostCtl::Network::UnknownPortGroupMessage(name));
     return portGroup;
+}
+
+void ChangeStandardSwitch(const boost::shared_ptr<CallSpec::Output>& output, const std::string& vswitchName,
+                          const std::function<void(HostCtl::Network::VirtualSwitch&)>& change) {
+    ReportingHostErrors(output, [&] {
+        if (std::unique_ptr<HostCtl::Network::VirtualSwitch> vswitch =
+                FindSwitch(SwitchLookup::ById, vswitchName, *output)) {
+            change(*vswitch);
+            FinishTrue(output);
+        }
+    });
 }
 
 }  // namespace NetworkNamespace

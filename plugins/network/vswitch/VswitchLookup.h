@@ -1,8 +1,8 @@
-// What the commands that work on one switch or port group by name share
-// (the policy commands and portgroup set): the parameter naming it, its
-// lookup with the message for an unknown name, and the end of a set command.
+// How the standard switch and port group commands find the switch or port
+// group they name, and what each reports when the host has none.
 #pragma once
 
+#include <functional>
 #include <memory>
 #include <string>
 #include <utility>
@@ -16,29 +16,39 @@
 namespace OrvixCli {
 namespace NetworkNamespace {
 
-// The parameters of a command whose only option is the required vswitch-name (short v).
-boost::shared_ptr<CallSpec::InputSpec> VswitchNameInput(const std::string& description);
-// The parameters of a command whose only option is the required portgroup-name (short p).
-boost::shared_ptr<CallSpec::InputSpec> PortGroupNameInput(const std::string& description);
-// portgroup-name, then the use-vswitch flag (short u), whose help has
-// `blanksBetweenSentences` blanks after its first sentence.
-boost::shared_ptr<CallSpec::InputSpec> PortGroupPolicySetInput(const std::string& description,
-                                                               int blanksBetweenSentences);
+// The ways a command finds the standard switch it names. They differ in the
+// library calls they make, and so in the faults that reach them, and in the
+// messages a missing switch gives.
+enum class SwitchLookup {
+    // The policy commands: PortsetImpl::IsValidVirtualSwitch, then
+    // VirtualSwitchInfoImpl::GetVirtualSwitchByName. "Unable to find a legacy
+    // virtual switch with the name X" when either finds nothing.
+    Legacy,
+    // The commands that add or remove an uplink or a port group:
+    // NetworkFactory::GetVirtualSwitchById. "Unable to find virtual switch
+    // with the name X" (the library's UnknownVirtualSwitchMessage).
+    ById,
+    // standard set: the calls of Legacy, with "X is not a valid name for a
+    // virtual switch" for a name the host does not know and "Unable to find
+    // a virtual switch with name X" when reading it gives nothing.
+    Settable,
+};
 
 // The standard switch of that name, or null after reporting that there is
 // none. Throws HostCtlException as the library does.
-std::unique_ptr<HostCtl::Network::VirtualSwitch> FindLegacySwitch(const std::string& name, CallSpec::Output& output);
+std::unique_ptr<HostCtl::Network::VirtualSwitch> FindSwitch(SwitchLookup how, const std::string& name,
+                                                            CallSpec::Output& output);
 // The port group of that name, or null after reporting that there is none.
 std::unique_ptr<HostCtl::Network::PortGroup> FindPortGroup(const std::string& name, CallSpec::Output& output);
 
-// Runs `body` with the switch named by vswitch-name; the library's errors,
-// from the lookup or from `body`, are reported as they are.
+// Runs `body` with the switch named by vswitch-name, found `how`; the
+// library's errors, from the lookup or from `body`, are reported as they are.
 template <typename Body>
-void OnLegacySwitch(const boost::shared_ptr<CallSpec::Input>& input, const boost::shared_ptr<CallSpec::Output>& output,
-                    Body&& body) {
+void OnSwitch(SwitchLookup how, const boost::shared_ptr<CallSpec::Input>& input,
+              const boost::shared_ptr<CallSpec::Output>& output, Body&& body) {
     ReportingHostErrors(output, [&] {
         if (std::unique_ptr<HostCtl::Network::VirtualSwitch> vswitch =
-                FindLegacySwitch(input->GetString("vswitch-name"), *output)) {
+                FindSwitch(how, input->GetString("vswitch-name"), *output)) {
             std::forward<Body>(body)(*vswitch);
         }
     });
@@ -56,22 +66,11 @@ void OnPortGroup(const boost::shared_ptr<CallSpec::Input>& input, const boost::s
     });
 }
 
-// The end of every set command: the edited policy is written only when no
-// option was refused, and the result is true either way, so the refusals
-// are reported beside it.
-template <typename Write>
-void WriteUnlessRefused(const boost::shared_ptr<CallSpec::Output>& output, Write&& write) {
-    if (!output->HasError()) std::forward<Write>(write)();
-    FinishTrue(output);
-}
-
-// A port group set command's own policy, reset first to inherit everything
-// from the switch when use-vswitch is given.
-template <typename Policy>
-Policy OwnPolicyToEdit(const CallSpec::Input& input, Policy own) {
-    if (input.GetFlag("use-vswitch")) own.UnsetAll();
-    return own;
-}
+// Applies `change` to the switch of that name, found ById, and finishes
+// with true; a missing switch or a library error ends the run without a
+// result.
+void ChangeStandardSwitch(const boost::shared_ptr<CallSpec::Output>& output, const std::string& vswitchName,
+                          const std::function<void(HostCtl::Network::VirtualSwitch&)>& change);
 
 }  // namespace NetworkNamespace
 }  // namespace OrvixCli

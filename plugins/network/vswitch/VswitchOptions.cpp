@@ -6,8 +6,8 @@
 #include <optional>
 #include <regex>
 
-#include "common/CommandSupport.h"
 #include "hostctl/network/nic/PnicImpl.h"
+#include "hostctl/network/vswitch/VswitchTables.h"
 
 namespace OrvixCli {
 namespace NetworkNamespace {
@@ -122,39 +122,74 @@ constexpr unsigned long long kBytesPerKib = 128;
 
 }  // namespace
 
+boost::shared_ptr<CallSpec::InputSpec> VswitchNameInput(const std::string& description) {
+    boost::shared_ptr<CallSpec::InputSpec> declared = CallSpec::InputSpec::New();
+    DeclareParameter(declared, "vswitch-name", CallSpec::PARAM_STRING, "v", description, Required::Yes);
+    return declared;
+}
+
+boost::shared_ptr<CallSpec::InputSpec> PortGroupNameInput(const std::string& description) {
+    boost::shared_ptr<CallSpec::InputSpec> declared = CallSpec::InputSpec::New();
+    DeclareParameter(declared, "portgroup-name", CallSpec::PARAM_STRING, "p", description, Required::Yes);
+    return declared;
+}
+
+boost::shared_ptr<CallSpec::InputSpec> PortGroupPolicySetInput(const std::string& description,
+                                                               int blanksBetweenSentences) {
+    boost::shared_ptr<CallSpec::InputSpec> declared = PortGroupNameInput(description);
+    DeclareParameter(declared, "use-vswitch", CallSpec::PARAM_FLAG, "u",
+                     "Reset all values for this policy to use parent virtual switch's settings instead of overriding "
+                     "the settings for the port group." +
+                         std::string(static_cast<std::size_t>(blanksBetweenSentences), ' ') +
+                         "Using this in conjunction with other settings will first reset all of the fields to use the "
+                         "virtual switch setting and then apply the other options after the reset.",
+                     Required::No);
+    return declared;
+}
+
+boost::shared_ptr<CallSpec::ParameterConstraint> CdpStatusConstraint() {
+    std::vector<CallSpec::ParameterConstraint::StringEnumValue> choices;
+    for (const std::string word : HostCtl::Network::kCdpStatusWords) {
+        choices.push_back({word, "CDP status is '" + word + "'"});
+    }
+    return StringEnum(choices);
+}
+
+int CdpStatusIndex(const std::string& word) {
+    const auto& words = HostCtl::Network::kCdpStatusWords;
+    const auto found = std::find_if(words.begin(), words.end(), [&](const char* w) { return word == w; });
+    // The framework has already refused unknown words, but a caller that
+    // bypasses it still gets a value the switch accepts.
+    if (found == words.end()) return static_cast<int>(words.size()) - 1;
+    return static_cast<int>(found - words.begin());
+}
+
 void AddFailoverParameters(boost::shared_ptr<CallSpec::InputSpec> inputSpec) {
-    boost::shared_ptr<CallSpec::ParameterConstraint> loadBalancing =
-        CallSpec::ParameterConstraint::New(CallSpec::CONSTRAINT_STRING_ENUM);
-    for (const LoadBalancingWord& entry : kLoadBalancingWords)
-        loadBalancing->AddStringEnum(entry.word, entry.description);
+    std::vector<CallSpec::ParameterConstraint::StringEnumValue> loadBalancing;
+    for (const LoadBalancingWord& entry : kLoadBalancingWords) loadBalancing.push_back({entry.word, entry.description});
     DeclareParameter(inputSpec, "load-balancing", CallSpec::PARAM_STRING, "l",
                      "Set the load balancing policy for this policy. This can be one of the following options: "
                      "%FULLENUM%",
-                     false, loadBalancing);
-
-    boost::shared_ptr<CallSpec::ParameterConstraint> failureDetection =
-        CallSpec::ParameterConstraint::New(CallSpec::CONSTRAINT_STRING_ENUM);
-    failureDetection->AddStringEnum("link", "Detect failures based on the NIC link state");
-    failureDetection->AddStringEnum("beacon", "Detect failures based on active beaconing to the vswitch");
+                     Required::No, StringEnum(loadBalancing));
     DeclareParameter(inputSpec, "failure-detection", CallSpec::PARAM_STRING, "f",
-                     "Set the method of determining how a network outage is detected. %FULLENUM%", false,
-                     failureDetection);
-
+                     "Set the method of determining how a network outage is detected. %FULLENUM%", Required::No,
+                     StringEnum({{"link", "Detect failures based on the NIC link state"},
+                                 {"beacon", "Detect failures based on active beaconing to the vswitch"}}));
     DeclareParameter(inputSpec, "notify-switches", CallSpec::PARAM_BOOL, "n",
-                     "Indicate whether to send a notification to physical switches on failover", false);
+                     "Indicate whether to send a notification to physical switches on failover", Required::No);
     DeclareParameter(inputSpec, "failback", CallSpec::PARAM_BOOL, "b",
                      "Configure whether a NIC will be used immediately when it comes back in service after a failover",
-                     false);
+                     Required::No);
     DeclareParameter(inputSpec, "active-uplinks", CallSpec::PARAM_STRING, "a",
                      "Configure the list of active adapters and their failover order. This list must be a comma "
                      "seperated list of values with the uplink name and no spaces. Example:  "
                      "--active-uplinks=hwnic0,hwnic3,hwnic7,hwnic1",
-                     false);
+                     Required::No);
     DeclareParameter(inputSpec, "standby-uplinks", CallSpec::PARAM_STRING, "s",
                      "Configure the list of standby adapters and their failover order. This list must be a comma "
                      "seperated list of values with the uplink name and no spaces. Example:  "
                      "--standby-uplinks=hwnic2,hwnic4,hwnic8,hwnic6,hwnic11",
-                     false);
+                     Required::No);
 }
 
 void AddSecurityParameters(boost::shared_ptr<CallSpec::InputSpec> inputSpec) {
@@ -163,33 +198,31 @@ void AddSecurityParameters(boost::shared_ptr<CallSpec::InputSpec> inputSpec) {
 
 void AddSecurityParameters(boost::shared_ptr<CallSpec::InputSpec> inputSpec, const std::string& promiscuousShortName) {
     DeclareParameter(inputSpec, "allow-promiscuous", CallSpec::PARAM_BOOL, promiscuousShortName,
-                     "Allow ports on the virtual switch to enter promiscuous mode.", false);
+                     "Allow ports on the virtual switch to enter promiscuous mode.", Required::No);
     DeclareParameter(inputSpec, "allow-mac-change", CallSpec::PARAM_BOOL, "m",
-                     "Allow ports on the virtual switch to change their MAC address.", false);
+                     "Allow ports on the virtual switch to change their MAC address.", Required::No);
     DeclareParameter(inputSpec, "allow-forged-transmits", CallSpec::PARAM_BOOL, "f",
-                     "Allow ports on the virtual switch to send packets with forged source information.", false);
+                     "Allow ports on the virtual switch to send packets with forged source information.", Required::No);
 }
 
 void AddShapingParameters(boost::shared_ptr<CallSpec::InputSpec> inputSpec) {
-    boost::shared_ptr<CallSpec::ParameterConstraint> positive =
-        CallSpec::ParameterConstraint::New(CallSpec::CONSTRAINT_INT_RANGE);
-    positive->SetIntRange(1, std::numeric_limits<std::int64_t>::max());
+    const std::int64_t unbounded = std::numeric_limits<std::int64_t>::max();
     DeclareParameter(inputSpec, "enabled", CallSpec::PARAM_BOOL, "e",
                      "Indicate whether to enable traffic shaping on this policy. If this is true then the "
                      "--avg-bandwidth, --peak-bandwidth and --burst-size options are required.",
-                     false);
+                     Required::No);
     DeclareParameter(inputSpec, "avg-bandwidth", CallSpec::PARAM_INT, "b",
                      "The averge bandwidth allowed for this shaping policy. This value is in Kbps (1 Kbps = 1000 "
                      "bits/s)",
-                     false, positive);
+                     Required::No, IntRange(1, unbounded));
     DeclareParameter(inputSpec, "peak-bandwidth", CallSpec::PARAM_INT, "k",
                      "The peak bandwidth allowed for this shaping policy. This value is in Kbps (1 Kbps = 1000 "
                      "bits/s)",
-                     false, positive);
+                     Required::No, IntRange(1, unbounded));
     DeclareParameter(inputSpec, "burst-size", CallSpec::PARAM_INT, "t",
                      "The largest burst size allowed for this shaping policy. This value is in Kib (1 Kib = 1024 "
                      "bits)",
-                     false, positive);
+                     Required::No, IntRange(1, unbounded));
 }
 
 void SetFailoverPolicy(boost::shared_ptr<CallSpec::Input> input, boost::shared_ptr<CallSpec::Output> output,
