@@ -12,9 +12,9 @@
 
 namespace {
 
-using PldCtl::Store::HostStore;
 using OrvixTest::Bin;
 using OrvixTest::Process;
+using PldCtl::Store::HostStore;
 
 // The counter the stress program keeps in the "system" singleton.
 std::int64_t Counter(HostStore& store) {
