@@ -8,7 +8,7 @@ packages=(
   build-essential cmake ninja-build pkg-config
   libboost-dev
   libsqlite3-dev nlohmann-json3-dev
-  libgtest-dev libgmock-dev
+  libgtest-dev libgmock-dev libexpat1-dev
   clang-format
 )
 

@@ -1,24 +1,34 @@
 #include "Transcript.h"
 
-#include <fcntl.h>
-#include <poll.h>
-#include <sys/wait.h>
-#include <unistd.h>
-
-#include <cstdlib>
 #include <fstream>
 #include <regex>
+#include <sstream>
 #include <stdexcept>
+
+#include "support/test_util.h"
 
 namespace OrvixTest {
 
-std::vector<std::string> SanitizerEnvironment() {
-    std::vector<std::string> env;
-    for (const char* name : {"ASAN_OPTIONS", "UBSAN_OPTIONS", "LSAN_OPTIONS"}) {
-        if (const char* value = std::getenv(name)) env.push_back(std::string(name) + "=" + value);
-    }
-    return env;
+namespace {
+
+const std::regex& StatusLine() {
+    static const std::regex status(R"(^\[(\d+)\]$)");
+    return status;
 }
+
+bool StartsWith(const std::string& line, const char* prefix) {
+    return line.rfind(prefix, 0) == 0;
+}
+
+bool IsComment(const std::string& line) {
+    return StartsWith(line, "##");
+}
+
+bool IsErrLine(const std::string& line) {
+    return line == "!" || StartsWith(line, "! ");
+}
+
+}  // namespace
 
 std::vector<std::string> SplitLines(const std::string& text) {
     std::vector<std::string> lines;
@@ -69,128 +79,99 @@ std::vector<std::string> SplitCommandLine(const std::string& text) {
 }
 
 Transcript ParseTranscript(const std::string& path, const std::string& baseDir) {
-    std::ifstream in(path);
-    if (!in) throw std::runtime_error("cannot read " + path);
+    if (!std::ifstream(path)) throw std::runtime_error("cannot read " + path);
+    return ParseTranscriptText(ReadFile(path), path, baseDir);
+}
+
+Transcript ParseTranscriptText(const std::string& text, const std::string& path, const std::string& baseDir) {
     Transcript t;
     t.path = path;
-    static const std::regex status(R"(^\[(\d+)\]$)");
+    std::istringstream in(text);
     std::string line;
     int number = 0;
     auto fail = [&](const std::string& what) {
         throw std::runtime_error(path + ":" + std::to_string(number) + ": " + what);
     };
-    // Empty lines are kept while reading a block and trimmed at its end.
-    auto trim = [](std::vector<std::string>& lines) {
-        while (!lines.empty() && lines.back().empty()) lines.pop_back();
-    };
+    // Blank and comment lines since the last line of the current step's
+    // block: the blanks may still turn out to be inside its output; with a
+    // comment among them they are the next step's preface.
+    std::vector<std::string> pending;
+    bool pendingComment = false;
     bool statusSeen = false;
     while (std::getline(in, line)) {
         ++number;
-        if (line.compare(0, 2, "##") == 0) {
-            if (t.steps.empty()) t.header.push_back(line);
-            continue;
-        }
-        if (line.compare(0, 2, "$ ") == 0) {
-            if (!t.steps.empty()) trim(t.steps.back().expectedOut);
+        if (StartsWith(line, "$ ")) {
             TranscriptStep step;
             step.line = number;
             step.command = line.substr(2);
             step.argv = SplitCommandLine(step.command);
             if (step.argv.empty()) fail("empty command");
+            if (!t.steps.empty()) step.preface.swap(pending);
+            pendingComment = statusSeen = false;
             t.steps.push_back(step);
-            statusSeen = false;
             continue;
         }
         if (t.steps.empty()) {
-            if (line.compare(0, 9, "@profile ") == 0) {
+            if (StartsWith(line, "@profile ")) {
                 t.profile = baseDir + "/" + line.substr(9);
-            } else if (line.compare(0, 5, "@env ") == 0) {
-                std::string assignment = line.substr(5);
-                std::size_t eq = assignment.find('=');
+            } else if (StartsWith(line, "@env ")) {
+                const std::string assignment = line.substr(5);
+                const std::size_t eq = assignment.find('=');
                 if (eq == std::string::npos) fail("@env needs NAME=VALUE");
                 t.env.emplace_back(assignment.substr(0, eq), assignment.substr(eq + 1));
-            } else if (!line.empty()) {
+            } else if (!line.empty() && !IsComment(line)) {
                 fail("expected a command (\"$ ...\"), a directive or a comment");
             }
             t.header.push_back(line);
             continue;
         }
+        if (line.empty() || IsComment(line)) {
+            pending.push_back(line);
+            pendingComment = pendingComment || IsComment(line);
+            continue;
+        }
+        if (pendingComment) fail("a comment ends a step's block; move it before the next \"$\" line");
+        if (statusSeen) fail("output after the exit status");
         TranscriptStep& step = t.steps.back();
         std::smatch m;
-        if (std::regex_match(line, m, status)) {
+        if (std::regex_match(line, m, StatusLine())) {
             step.expectedStatus = std::stoi(m[1]);
             statusSeen = true;
-        } else if (statusSeen && !line.empty()) {
-            fail("output after the exit status");
-        } else if (line == "!" || line.compare(0, 2, "! ") == 0) {
+        } else if (IsErrLine(line)) {
             step.expectedErr.push_back(line.size() > 2 ? line.substr(2) : "");
-        } else if (!statusSeen) {
+        } else {
+            step.expectedOut.insert(step.expectedOut.end(), pending.begin(), pending.end());
             step.expectedOut.push_back(line);
         }
+        pending.clear();
     }
-    if (!t.steps.empty()) trim(t.steps.back().expectedOut);
+    t.trailer = pending;
     return t;
 }
 
-namespace {
-
-void Drain(int outFd, int errFd, ProcessResult& result) {
-    pollfd fds[2] = {{outFd, POLLIN, 0}, {errFd, POLLIN, 0}};
-    std::string* sinks[2] = {&result.out, &result.err};
-    int open = 2;
-    char buffer[65536];
-    while (open > 0) {
-        if (poll(fds, 2, -1) < 0) {
-            if (errno == EINTR) continue;
-            throw std::runtime_error("poll failed");
-        }
-        for (int i = 0; i < 2; ++i) {
-            if (fds[i].fd < 0 || !(fds[i].revents & (POLLIN | POLLHUP | POLLERR))) continue;
-            ssize_t n = read(fds[i].fd, buffer, sizeof buffer);
-            if (n > 0) {
-                sinks[i]->append(buffer, static_cast<std::size_t>(n));
-            } else if (n == 0 || errno != EINTR) {
-                close(fds[i].fd);
-                fds[i].fd = -1;
-                --open;
+std::string RenderTranscript(const Transcript& t, const std::vector<ProcessResult>& results) {
+    if (results.size() != t.steps.size()) throw std::invalid_argument("one result a step is needed");
+    std::ostringstream out;
+    auto lines = [&](const std::vector<std::string>& block) {
+        for (const auto& l : block) out << l << "\n";
+    };
+    lines(t.header);
+    for (std::size_t i = 0; i < t.steps.size(); ++i) {
+        const TranscriptStep& step = t.steps[i];
+        lines(step.preface);
+        out << "$ " << step.command << "\n";
+        for (const auto& l : SplitLines(results[i].out)) {
+            if (StartsWith(l, "$ ") || IsComment(l) || IsErrLine(l) || std::regex_match(l, StatusLine())) {
+                throw std::runtime_error(t.path + ":" + std::to_string(step.line) + ": the output line '" + l +
+                                         "' would not read back as output");
             }
+            out << l << "\n";
         }
+        for (const auto& l : SplitLines(results[i].err)) out << (l.empty() ? "!" : "! " + l) << "\n";
+        if (results[i].status != 0) out << "[" << results[i].status << "]\n";
     }
-}
-
-}  // namespace
-
-ProcessResult RunProcess(const std::vector<std::string>& argv, const std::string& cwd,
-                         const std::vector<std::string>& env) {
-    int outPipe[2], errPipe[2];
-    if (pipe2(outPipe, O_CLOEXEC) != 0 || pipe2(errPipe, O_CLOEXEC) != 0) throw std::runtime_error("pipe failed");
-
-    std::vector<char*> args, envp;
-    for (const auto& a : argv) args.push_back(const_cast<char*>(a.c_str()));
-    args.push_back(nullptr);
-    for (const auto& e : env) envp.push_back(const_cast<char*>(e.c_str()));
-    envp.push_back(nullptr);
-
-    pid_t pid = fork();
-    if (pid < 0) throw std::runtime_error("fork failed");
-    if (pid == 0) {
-        int devnull = open("/dev/null", O_RDONLY);
-        dup2(devnull, 0);
-        dup2(outPipe[1], 1);
-        dup2(errPipe[1], 2);
-        if (chdir(cwd.c_str()) != 0) _exit(126);
-        execvpe(args[0], args.data(), envp.data());
-        _exit(127);
-    }
-    close(outPipe[1]);
-    close(errPipe[1]);
-    ProcessResult result;
-    Drain(outPipe[0], errPipe[0], result);
-    int wstatus = 0;
-    while (waitpid(pid, &wstatus, 0) < 0 && errno == EINTR) {
-    }
-    result.status = WIFEXITED(wstatus) ? WEXITSTATUS(wstatus) : 128 + WTERMSIG(wstatus);
-    return result;
+    lines(t.trailer);
+    return out.str();
 }
 
 }  // namespace OrvixTest

@@ -1,8 +1,8 @@
 // Transcript tests: a .t file is a session at the shell, run against a fresh
 // host store, that must come out exactly the same again.
 //
-//   ## a comment line (anywhere)
-//   @profile fixtures/two-switches.json    the profile the host is created from
+//   ## a comment line (in the header or between steps)
+//   @profile fixtures/vswitch/x.json       the profile the host is created from
 //                                          (relative to tests/e2e; default: the
 //                                          embedded default host)
 //   @env NAME=VALUE                        an extra environment variable
@@ -13,19 +13,23 @@
 //
 // Commands run in a new temporary folder that holds the store (host.db),
 // written $TMP in commands and in expected output; orvixcli and orvix-hostsim
-// are the binaries of this build, other programs (sh, head, ...) come from
-// PATH. Trailing empty lines of a block are not
-// significant. With ORVIX_UPDATE_TRANSCRIPTS=1 the files are rewritten with
-// what the commands printed, for reviewing as a diff.
+// are the binaries of this build, other programs (sh, cat, ...) come from
+// PATH. Trailing empty lines of a block are not significant; a comment ends
+// a step's block. With ORVIX_UPDATE_TRANSCRIPTS=1 the files are rewritten
+// with what the commands printed, every other line kept as written, for
+// reviewing as a diff.
 #pragma once
 
 #include <string>
 #include <vector>
 
+#include "support/process.h"
+
 namespace OrvixTest {
 
 struct TranscriptStep {
-    int line = 0;  // of the "$" line, for messages
+    int line = 0;                      // of the "$" line, for messages
+    std::vector<std::string> preface;  // comment and blank lines between the previous step and this one
     std::string command;
     std::vector<std::string> argv;
     std::vector<std::string> expectedOut;
@@ -37,29 +41,23 @@ struct Transcript {
     std::string path;
     std::string profile;  // absolute path, or "" for the default host
     std::vector<std::pair<std::string, std::string>> env;
-    std::vector<std::string> header;  // the lines before the first step, kept when rewriting
+    std::vector<std::string> header;  // every line before the first step
     std::vector<TranscriptStep> steps;
+    std::vector<std::string> trailer;  // comment and blank lines after the last step
 };
 
-// Throws std::runtime_error on a malformed file.
+// Throw std::runtime_error on a malformed transcript.
 Transcript ParseTranscript(const std::string& path, const std::string& baseDir);
+Transcript ParseTranscriptText(const std::string& text, const std::string& path, const std::string& baseDir);
+
+// The transcript's text with each step's expected block replaced by what
+// the step printed (one result a step), every other line as written. Throws
+// std::runtime_error for output a transcript cannot hold (a stdout line that
+// would read back as a command, a comment, stderr or a status).
+std::string RenderTranscript(const Transcript& t, const std::vector<ProcessResult>& results);
+
 std::vector<std::string> SplitCommandLine(const std::string& text);
-
-struct ProcessResult {
-    std::string out;
-    std::string err;
-    int status = -1;  // exit status, or 128 + signal
-};
-
-// Runs argv[0] (found in PATH unless it contains a slash) in `cwd` with
-// `env` as its whole environment; feeds it no input.
-ProcessResult RunProcess(const std::vector<std::string>& argv, const std::string& cwd,
-                         const std::vector<std::string>& env);
-
+// Lines without their "\n"; trailing empty lines dropped.
 std::vector<std::string> SplitLines(const std::string& text);
-
-// The sanitizer settings of this test run ("ASAN_OPTIONS=..."), for the
-// environment of the programs it starts.
-std::vector<std::string> SanitizerEnvironment();
 
 }  // namespace OrvixTest

@@ -1,5 +1,4 @@
 // The six output formatters, compared on complete rendered text.
-#include <cctype>
 #include <cstdint>
 #include <limits>
 #include <map>
@@ -12,13 +11,13 @@
 
 #include "framework/Format.h"
 #include "framework/MetaObj.h"
+#include "support/documents.h"
 
 namespace {
 
 using AutoCli::FindFormatter;
 using AutoCli::FormatHints;
 using AutoCli::FormatterNames;
-using AutoCli::SplitNames;
 using MetaObj::MetaBool;
 using MetaObj::MetaInt;
 using MetaObj::MetaList;
@@ -82,126 +81,6 @@ boost::shared_ptr<MetaList> Strings(const std::vector<std::string>& items) {
     boost::shared_ptr<MetaList> list = MetaList::New(MetaObj::META_STRING);
     for (const auto& item : items) list->Append(item);
     return list;
-}
-
-// A small strict JSON reader: true when the whole text is one JSON value
-// with valid UTF-8 and no raw control characters in strings.
-class JsonChecker {
-public:
-    explicit JsonChecker(const std::string& text) : s_(text) {}
-    bool Valid() {
-        bool ok = Value();
-        Blank();
-        return ok && i_ == s_.size();
-    }
-
-private:
-    void Blank() {
-        while (i_ < s_.size() && std::string(" \t\r\n").find(s_[i_]) != std::string::npos) ++i_;
-    }
-    bool Eat(char c) {
-        Blank();
-        if (i_ < s_.size() && s_[i_] == c) return ++i_, true;
-        return false;
-    }
-    bool Word(const std::string& w) {
-        if (s_.compare(i_, w.size(), w) != 0) return false;
-        i_ += w.size();
-        return true;
-    }
-    bool Value() {
-        Blank();
-        if (i_ >= s_.size()) return false;
-        char c = s_[i_];
-        if (c == '{') return Items('}', true);
-        if (c == '[') return Items(']', false);
-        if (c == '"') return String();
-        if (Word("true") || Word("false") || Word("null")) return true;
-        std::size_t start = i_;
-        if (s_[i_] == '-') ++i_;
-        while (i_ < s_.size() && std::isdigit(static_cast<unsigned char>(s_[i_]))) ++i_;
-        return i_ > start && std::isdigit(static_cast<unsigned char>(s_[i_ - 1]));
-    }
-    bool Items(char close, bool object) {
-        ++i_;
-        if (Eat(close)) return true;
-        do {
-            if (object && !(Blank(), String() && Eat(':'))) return false;
-            if (!Value()) return false;
-        } while (Eat(','));
-        return Eat(close);
-    }
-    bool String() {
-        if (s_[i_] != '"') return false;
-        for (++i_; i_ < s_.size(); ++i_) {
-            unsigned char c = s_[i_];
-            if (c == '"') return ++i_, true;
-            if (c < 0x20) return false;
-            if (c == '\\') {
-                ++i_;
-                if (i_ < s_.size() && s_[i_] == 'u') {
-                    if (i_ + 4 >= s_.size()) return false;
-                    for (int k = 1; k <= 4; ++k) {
-                        if (!std::isxdigit(static_cast<unsigned char>(s_[i_ + k]))) return false;
-                    }
-                    i_ += 4;
-                } else if (i_ >= s_.size() || std::string("\"\\/bfnrt").find(s_[i_]) == std::string::npos) {
-                    return false;
-                }
-            } else if (c >= 0x80) {
-                int more = c >= 0xF0 ? 3 : c >= 0xE0 ? 2 : c >= 0xC2 ? 1 : -1;
-                if (more < 0 || c > 0xF4) return false;
-                for (int k = 0; k < more; ++k) {
-                    if (++i_ >= s_.size() || (static_cast<unsigned char>(s_[i_]) & 0xC0) != 0x80) return false;
-                }
-            }
-        }
-        return false;
-    }
-    const std::string& s_;
-    std::size_t i_ = 0;
-};
-
-TEST(FormatHints, LooksUpEachKindOfHint) {
-    FormatHints hints(Hints{{"fields:VirtualSwitch", "Name,Num Ports"},
-                            {"header:VirtualSwitch", "Switch %Name%"},
-                            {"header:Port", "<NONE>"},
-                            {"table-columns", "Name"},
-                            {"table-columns:Port", "ID,Client"},
-                            {"table-columns:Uplink", ""},
-                            {"units:VirtualSwitch.MTU", "bytes"}});
-    EXPECT_EQ(hints.Fields("VirtualSwitch"), (std::vector<std::string>{"Name", "Num Ports"}));
-    EXPECT_EQ(hints.Fields("Port"), std::nullopt);
-    EXPECT_EQ(hints.Header("VirtualSwitch"), std::string("Switch %Name%"));
-    EXPECT_FALSE(hints.HasNoHeader("VirtualSwitch"));
-    EXPECT_TRUE(hints.HasNoHeader("Port"));
-    EXPECT_EQ(hints.Header("Port"), std::string("<NONE>"));
-    EXPECT_EQ(hints.Header("Other"), std::nullopt);
-    EXPECT_FALSE(hints.HasNoHeader("Other"));
-    // The type's own column list first, then the general one; an empty
-    // list lifts any restriction.
-    EXPECT_EQ(hints.TableColumns("Port"), (std::vector<std::string>{"ID", "Client"}));
-    EXPECT_EQ(hints.TableColumns("VirtualSwitch"), (std::vector<std::string>{"Name"}));
-    EXPECT_EQ(hints.TableColumns("Uplink"), std::nullopt);
-    EXPECT_EQ(FormatHints(Hints{{"table-columns", ""}}).TableColumns("Port"), std::nullopt);
-    EXPECT_EQ(hints.Unit("VirtualSwitch", "MTU"), "bytes");
-    EXPECT_EQ(hints.Unit("VirtualSwitch", "Name"), "");
-    EXPECT_EQ(hints.Unit("Port", "MTU"), "");
-
-    EXPECT_EQ(SplitNames("a,b,c"), (std::vector<std::string>{"a", "b", "c"}));
-    EXPECT_EQ(SplitNames(""), std::vector<std::string>{});
-    EXPECT_EQ(SplitNames("Port ID, Name,"), (std::vector<std::string>{"Port ID", " Name"}));
-    EXPECT_EQ(SplitNames("a,,b"), (std::vector<std::string>{"a", "b"}));
-}
-
-TEST(Formatters, RegistryKnowsTheSixByName) {
-    EXPECT_EQ(FormatterNames(), (std::vector<std::string>{"simple", "table", "json", "xml", "csv", "keyvalue"}));
-    for (const auto& name : FormatterNames()) {
-        ASSERT_NE(FindFormatter(name), nullptr) << name;
-        EXPECT_EQ(FindFormatter(name)->Name(), name);
-    }
-    EXPECT_EQ(FindFormatter("JSON"), nullptr);
-    EXPECT_EQ(FindFormatter(""), nullptr);
 }
 
 TEST(Formatters, AbsentValuesPrintNothingAnywhere) {
@@ -271,19 +150,10 @@ TEST(SimpleFormatter, FieldsHintOrdersAndFilters) {
               "      Interval: 1\n");
 }
 
-TEST(SimpleFormatter, ListsAndScalarsAtTopLevel) {
-    Hints hints{{"header:VirtualSwitch", "Switch %Name%"}, {"fields:VirtualSwitch", "Name,Uplinks"}};
-    EXPECT_EQ(Render("simple", SwitchList({Switch("vSwitch0", 8, {"hwnic0"}), Switch("vSwitch1", 8, {})}), hints),
-              "Switch vSwitch0\n"
-              "   Name: vSwitch0\n"
-              "   Uplinks: hwnic0\n"
-              "\n"
-              "Switch vSwitch1\n"
-              "   Name: vSwitch1\n"
-              "   Uplinks: \n");
-    EXPECT_EQ(Render("simple", SwitchList({}), hints), "");
+TEST(SimpleFormatter, ScalarsAndStringListsAtTopLevel) {
     EXPECT_EQ(Render("simple", Strings({"hwnic0", "hwnic1"})), "hwnic0\nhwnic1\n");
     EXPECT_EQ(Render("simple", Strings({})), "");
+    // A successful operation prints nothing; anything else is printed.
     EXPECT_EQ(Render("simple", MetaBool::New(true)), "");
     EXPECT_EQ(Render("simple", MetaBool::New(false)), "false\n");
     EXPECT_EQ(Render("simple", MetaString::New("done")), "done\n");
@@ -351,7 +221,8 @@ TEST(TableFormatter, EmptyListsAndNonRecords) {
     EXPECT_EQ(Render("csv", SwitchList({}), {{"table-columns", "Name,MTU"}}), "Name,MTU\n");
     for (const char* name : {"table", "csv"}) {
         EXPECT_EQ(Render(name, SwitchList({})), "") << name;
-        EXPECT_EQ(Render(name, MetaList::New(MetaObj::META_STRUCT), {{"table-columns:VirtualSwitch", "Name"}}), "") << name;
+        EXPECT_EQ(Render(name, MetaList::New(MetaObj::META_STRUCT), {{"table-columns:VirtualSwitch", "Name"}}), "")
+            << name;
     }
     EXPECT_EQ(Render("table", Strings({"a", "b"})), "a\nb\n");
     EXPECT_EQ(Render("table", MetaInt::New(42)), "42\n");
@@ -384,8 +255,8 @@ TEST(JsonFormatter, StructureOrderAndNumbers) {
     StructPtr s = RichSwitch();
     s->SetField("Big", std::numeric_limits<unsigned long long>::max());
     s->SetField("Negative", -5);
-    const std::string json = Render("json", s, {{"fields:VirtualSwitch", "Uplinks,Name"},
-                                                {"units:VirtualSwitch.MTU", "bytes"}});
+    const std::string json =
+        Render("json", s, {{"fields:VirtualSwitch", "Uplinks,Name"}, {"units:VirtualSwitch.MTU", "bytes"}});
     EXPECT_EQ(json,
               "{\n"
               "  \"Uplinks\": [\n"
@@ -413,7 +284,7 @@ TEST(JsonFormatter, StructureOrderAndNumbers) {
               "  \"Big\": 18446744073709551615,\n"
               "  \"Negative\": -5\n"
               "}\n");
-    EXPECT_TRUE(JsonChecker(json).Valid());
+    EXPECT_TRUE(OrvixTest::IsValidJson(json));
     EXPECT_EQ(Render("json", SwitchList({})), "[]\n");
     EXPECT_EQ(Render("json", MetaStruct::New("Empty")), "{}\n");
     EXPECT_EQ(Render("json", Strings({"a"})), "[\n  \"a\"\n]\n");
@@ -422,63 +293,64 @@ TEST(JsonFormatter, StructureOrderAndNumbers) {
 }
 
 TEST(JsonFormatter, EscapingKeepsOutputValid) {
-    const std::string nasty = std::string("q\"b\\s/\n\t\r\b\f\x01\x1f\x7f") + "é€😀\xEF\xBF\xBD" +
-                              "\xFF" + "\xC3" + "\xED\xA0\x80" + "\xC0\xAF" + "\xF4\x90\x80\x80" + "end\xE2\x82";
+    const std::string nasty = std::string("q\"b\\s/\n\t\r\b\f\x01\x1f\x7f") + "é€😀\xEF\xBF\xBD" + "\xFF" + "\xC3" +
+                              "\xED\xA0\x80" + "\xC0\xAF" + "\xF4\x90\x80\x80" + "end\xE2\x82";
     StructPtr record = MetaStruct::New("T");
     record->SetField("Key \"1\"\n", nasty);
     const std::string json = Render("json", record);
-    EXPECT_EQ(json, "{\n  \"Key \\\"1\\\"\\n\": \"q\\\"b\\\\s/\\n\\t\\r\\b\\f\\u0001\\u001f\x7f"
-                    "é€😀\xEF\xBF\xBD"
-                    "\\ufffd\\ufffd\\ufffd\\ufffd\\ufffd\\ufffd\\ufffd\\ufffd\\ufffd\\ufffd\\ufffd"
-                    "end\\ufffd\\ufffd\"\n}\n");
-    EXPECT_TRUE(JsonChecker(json).Valid());
-    EXPECT_FALSE(JsonChecker("{\"a\": \"\xFF\"}").Valid());  // the checker itself is strict
-    EXPECT_FALSE(JsonChecker("{\"a\": 1,}").Valid());
+    EXPECT_EQ(json,
+              "{\n  \"Key \\\"1\\\"\\n\": \"q\\\"b\\\\s/\\n\\t\\r\\b\\f\\u0001\\u001f\x7f"
+              "é€😀\xEF\xBF\xBD"
+              "\\ufffd\\ufffd\\ufffd\\ufffd\\ufffd\\ufffd\\ufffd\\ufffd\\ufffd\\ufffd\\ufffd"
+              "end\\ufffd\\ufffd\"\n}\n");
+    EXPECT_TRUE(OrvixTest::IsValidJson(json));
     for (const MetaObjectPtr& value : {MetaObjectPtr(RichSwitch()), MetaObjectPtr(Strings({nasty, ""})),
                                        MetaObjectPtr(SwitchList({RichSwitch(), Switch("x", 1, {})}))}) {
-        EXPECT_TRUE(JsonChecker(Render("json", value)).Valid());
+        EXPECT_TRUE(OrvixTest::IsValidJson(Render("json", value)));
     }
 }
 
 TEST(XmlFormatter, StructureOfRecordsListsAndScalars) {
     StructPtr s = RichSwitch();
     s->SetField("Big", std::numeric_limits<unsigned long long>::max());
-    EXPECT_EQ(Render("xml", SwitchList({s}), {{"fields:VirtualSwitch", "Ports,Name"}, {"units:VirtualSwitch.MTU", "b"}}),
-              "<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n"
-              "<output>\n"
-              "  <list type=\"structure\">\n"
-              "    <structure typeName=\"VirtualSwitch\">\n"
-              "      <field name=\"Ports\">\n"
-              "        <list type=\"structure\">\n"
-              "          <structure typeName=\"Port\">\n"
-              "            <field name=\"ID\"><integer>1</integer></field>\n"
-              "            <field name=\"Client\"><string>vm1</string></field>\n"
-              "          </structure>\n"
-              "          <structure typeName=\"Port\">\n"
-              "            <field name=\"ID\"><integer>2</integer></field>\n"
-              "          </structure>\n"
-              "        </list>\n"
-              "      </field>\n"
-              "      <field name=\"Name\"><string>vSwitch0</string></field>\n"
-              "      <field name=\"Num Ports\"><integer>128</integer></field>\n"
-              "      <field name=\"Uplinks\"><list type=\"string\"><string>hwnic0</string>"
-              "<string>hwnic1</string></list></field>\n"
-              "      <field name=\"MTU\"><integer>1500</integer></field>\n"
-              "      <field name=\"Comment\"><string></string></field>\n"
-              "      <field name=\"Portgroups\"><list type=\"string\"></list></field>\n"
-              "      <field name=\"Beacon\">\n"
-              "        <structure typeName=\"BeaconConfig\">\n"
-              "          <field name=\"Enabled\"><boolean>false</boolean></field>\n"
-              "          <field name=\"Interval\"><integer>1</integer></field>\n"
-              "        </structure>\n"
-              "      </field>\n"
-              "      <field name=\"Big\"><integer>18446744073709551615</integer></field>\n"
-              "    </structure>\n"
-              "  </list>\n"
-              "</output>\n");
+    EXPECT_EQ(
+        Render("xml", SwitchList({s}), {{"fields:VirtualSwitch", "Ports,Name"}, {"units:VirtualSwitch.MTU", "b"}}),
+        "<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n"
+        "<output>\n"
+        "  <list type=\"structure\">\n"
+        "    <structure typeName=\"VirtualSwitch\">\n"
+        "      <field name=\"Ports\">\n"
+        "        <list type=\"structure\">\n"
+        "          <structure typeName=\"Port\">\n"
+        "            <field name=\"ID\"><integer>1</integer></field>\n"
+        "            <field name=\"Client\"><string>vm1</string></field>\n"
+        "          </structure>\n"
+        "          <structure typeName=\"Port\">\n"
+        "            <field name=\"ID\"><integer>2</integer></field>\n"
+        "          </structure>\n"
+        "        </list>\n"
+        "      </field>\n"
+        "      <field name=\"Name\"><string>vSwitch0</string></field>\n"
+        "      <field name=\"Num Ports\"><integer>128</integer></field>\n"
+        "      <field name=\"Uplinks\"><list type=\"string\"><string>hwnic0</string>"
+        "<string>hwnic1</string></list></field>\n"
+        "      <field name=\"MTU\"><integer>1500</integer></field>\n"
+        "      <field name=\"Comment\"><string></string></field>\n"
+        "      <field name=\"Portgroups\"><list type=\"string\"></list></field>\n"
+        "      <field name=\"Beacon\">\n"
+        "        <structure typeName=\"BeaconConfig\">\n"
+        "          <field name=\"Enabled\"><boolean>false</boolean></field>\n"
+        "          <field name=\"Interval\"><integer>1</integer></field>\n"
+        "        </structure>\n"
+        "      </field>\n"
+        "      <field name=\"Big\"><integer>18446744073709551615</integer></field>\n"
+        "    </structure>\n"
+        "  </list>\n"
+        "</output>\n");
     const std::string prolog = "<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n<output>\n";
-    EXPECT_EQ(Render("xml", Strings({"a", "b"})),
-              prolog + "  <list type=\"string\">\n    <string>a</string>\n    <string>b</string>\n  </list>\n</output>\n");
+    EXPECT_EQ(
+        Render("xml", Strings({"a", "b"})),
+        prolog + "  <list type=\"string\">\n    <string>a</string>\n    <string>b</string>\n  </list>\n</output>\n");
     EXPECT_EQ(Render("xml", SwitchList({})), prolog + "  <list type=\"structure\"></list>\n</output>\n");
     EXPECT_EQ(Render("xml", MetaBool::New(true)), prolog + "  <boolean>true</boolean>\n</output>\n");
 }

@@ -23,7 +23,7 @@ protected:
         return names;
     }
 
-    StoreTest::TempDir dir;
+    OrvixTest::TempDir dir;
     std::unique_ptr<HostStore> store;
 };
 

@@ -34,7 +34,7 @@ class FaultTest : public ::testing::Test {
 protected:
     void SetUp() override { store = HostStore::Create(dir / "host.db", StoreTest::EmptyProfileText()); }
 
-    StoreTest::TempDir dir;
+    OrvixTest::TempDir dir;
     std::unique_ptr<HostStore> store;
 };
 

@@ -10,10 +10,10 @@
 
 namespace {
 
+using OrvixTest::ScopedEnv;
 using PldCtl::Store::HostStore;
 using PldCtl::Store::Json;
 using PldCtl::Store::StoreError;
-using StoreTest::ScopedEnv;
 
 std::string OpenError(const std::string& path) {
     try {
@@ -32,7 +32,7 @@ std::vector<std::string> DirectoryEntries(const std::string& directory) {
 }
 
 TEST(StoreOpenTest, CreateBuildsACompleteStoreInPrivateDirectories) {
-    StoreTest::TempDir dir;
+    OrvixTest::TempDir dir;
     const std::string path = dir / "state/orvix/host.db";
     auto store = HostStore::Create(path, StoreTest::Fixture("small-host.json"), "small-host.json");
     EXPECT_EQ(store->Path(), path);
@@ -48,20 +48,20 @@ TEST(StoreOpenTest, CreateBuildsACompleteStoreInPrivateDirectories) {
     EXPECT_EQ(StoreTest::RawSql(path, "SELECT value FROM meta WHERE name = 'profile'"), "small-host.json");
     EXPECT_EQ(HostStore::Open(path)->List("portgroups").size(), 3u);
 
-    const std::string before = StoreTest::ReadFile(path);
+    const std::string before = OrvixTest::ReadFile(path);
     try {
         HostStore::Create(path, StoreTest::EmptyProfileText());
         FAIL() << "created over an existing store";
     } catch (const StoreError& e) {
         EXPECT_EQ(std::string(e.what()), "host store '" + path + "' exists already");
     }
-    EXPECT_EQ(StoreTest::ReadFile(path), before);
+    EXPECT_EQ(OrvixTest::ReadFile(path), before);
     // An existing store is opened as it is; the profile is not even read.
     EXPECT_EQ(HostStore::OpenOrCreate(path, "not json")->List("nics").size(), 2u);
 }
 
 TEST(StoreOpenTest, BadProfileCreatesNothing) {
-    StoreTest::TempDir dir;
+    OrvixTest::TempDir dir;
     const std::string path = dir / "host.db";
     EXPECT_THROW(HostStore::OpenOrCreate(path, "{"), PldCtl::Store::ProfileError);
     EXPECT_THROW(HostStore::Create(path, R"({"format": "orvix-host-profile", "version": 1, "nic": []})"),
@@ -70,24 +70,24 @@ TEST(StoreOpenTest, BadProfileCreatesNothing) {
 }
 
 TEST(StoreOpenTest, RefusedFilesStayAsTheyWere) {
-    StoreTest::TempDir dir;
+    OrvixTest::TempDir dir;
     EXPECT_EQ(OpenError(dir / "missing.db"), "host store '" + (dir / "missing.db") + "' does not exist");
     EXPECT_EQ(OpenError(dir.Path()), "host store '" + dir.Path() + "' is not a regular file");
 
     const std::string newer = dir / "newer.db";
     HostStore::Create(newer, StoreTest::EmptyProfileText());
     StoreTest::RawSql(newer, "PRAGMA user_version = 7");
-    const std::string newerBytes = StoreTest::ReadFile(newer);
+    const std::string newerBytes = OrvixTest::ReadFile(newer);
     EXPECT_EQ(OpenError(newer),
               "host store '" + newer + "' was written by a newer version (schema 7, this build reads up to 1)");
-    EXPECT_EQ(StoreTest::ReadFile(newer), newerBytes);
+    EXPECT_EQ(OrvixTest::ReadFile(newer), newerBytes);
 
     const std::string foreign = dir / "foreign.db";
     StoreTest::RawSql(foreign, "CREATE TABLE t(x); INSERT INTO t VALUES (1)");
-    const std::string foreignBytes = StoreTest::ReadFile(foreign);
+    const std::string foreignBytes = OrvixTest::ReadFile(foreign);
     EXPECT_EQ(OpenError(foreign),
               "host store '" + foreign + "' is an SQLite database of another application, not a host store");
-    EXPECT_EQ(StoreTest::ReadFile(foreign), foreignBytes);
+    EXPECT_EQ(OrvixTest::ReadFile(foreign), foreignBytes);
     // Refused opens leave no side files behind either.
     EXPECT_EQ(DirectoryEntries(dir.Path()), (std::vector<std::string>{"foreign.db", "newer.db"}));
 }
@@ -110,7 +110,7 @@ TEST(StoreOpenTest, ResolvePathFollowsTheEnvironment) {
 }
 
 TEST(StoreOpenTest, DefaultStoreIsCreatedFromTheNamedProfile) {
-    StoreTest::TempDir dir;
+    OrvixTest::TempDir dir;
     const std::string path = dir / "sub/host.db";
     ScopedEnv db("ORVIX_HOST_DB", path);
     {
@@ -124,7 +124,7 @@ TEST(StoreOpenTest, DefaultStoreIsCreatedFromTheNamedProfile) {
             EXPECT_NE(message.find("'" + path + "'"), std::string::npos) << message;
             EXPECT_NE(message.find(dir / "missing.json"), std::string::npos) << message;
         }
-        StoreTest::WriteFile(dir / "bad.json", R"({"format": "orvix-host-profile", "version": 1, "nics": [{}]})");
+        OrvixTest::WriteFile(dir / "bad.json", R"({"format": "orvix-host-profile", "version": 1, "nics": [{}]})");
         ScopedEnv bad("ORVIX_HOST_PROFILE", dir / "bad.json");
         try {
             HostStore::Default();
@@ -150,7 +150,7 @@ TEST(StoreOpenTest, DefaultStoreIsCreatedFromTheNamedProfile) {
 }
 
 TEST(StoreOpenTest, RacingCreatorsAllOpenTheWinnersStore) {
-    StoreTest::TempDir dir;
+    OrvixTest::TempDir dir;
     const std::string path = dir / "race/host.db";
     constexpr int kCreators = 6;
     std::vector<std::string> hostnames(kCreators);

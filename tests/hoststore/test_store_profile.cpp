@@ -95,7 +95,7 @@ TEST(ProfileTest, KeyOfAndValidateWithoutOrigin) {
 }
 
 TEST(ProfileTest, ProfileFiles) {
-    StoreTest::TempDir dir;
+    OrvixTest::TempDir dir;
     EXPECT_EQ(
         ParseProfile(PldCtl::Store::ReadProfileFile(StoreTest::FixturePath("small-host.json")), "x")["nics"].size(),
         2u);

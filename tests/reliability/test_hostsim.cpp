@@ -2,7 +2,8 @@
 #include <gtest/gtest.h>
 
 #include "hostctl/Lib.h"
-#include "reliability_util.h"
+#include "support/process.h"
+#include "support/store_test_util.h"
 
 namespace {
 
@@ -22,7 +23,7 @@ protected:
         return RunBare(args);
     }
     Result RunBare(const std::vector<std::string>& args) {
-        Reliability::Process process(Reliability::Bin("orvix-hostsim"), args, dir / "out", dir / "err");
+        OrvixTest::Process process(OrvixTest::Bin("orvix-hostsim"), args, dir / "out", dir / "err");
         const int status = process.Wait();
         return {WIFEXITED(status) ? WEXITSTATUS(status) : -1, process.Out(), process.Err()};
     }
@@ -34,7 +35,7 @@ protected:
         return result.err;
     }
 
-    StoreTest::TempDir dir;
+    OrvixTest::TempDir dir;
     const std::string db = dir / "host.db";
     const std::string fixture = StoreTest::FixturePath("small-host.json");
     const std::string fixtureDump = PldCtl::Store::FormatProfile(StoreTest::Fixture("small-host.json")) + "\n";
@@ -42,7 +43,7 @@ protected:
 };
 
 TEST_F(HostsimTest, InitDumpAndForce) {
-    StoreTest::WriteFile(dir / "empty.json", StoreTest::EmptyProfileText());
+    OrvixTest::WriteFile(dir / "empty.json", StoreTest::EmptyProfileText());
     EXPECT_EQ(Run({"init", "--profile", fixture}).status, 0);
     EXPECT_EQ(Run({"dump"}).out, fixtureDump);
     EXPECT_EQ(Failure({"init", "--profile=" + (dir / "empty.json")}, 1),
@@ -55,7 +56,7 @@ TEST_F(HostsimTest, InitDumpAndForce) {
     EXPECT_EQ(Run({"fault", "list"}).out, "ID  OPERATION  KEY  REMAINING  MESSAGE\n");
 
     // A damaged store is replaced only with --force.
-    StoreTest::WriteFile(db, "not a database at all");
+    OrvixTest::WriteFile(db, "not a database at all");
     EXPECT_EQ(Failure({"dump"}, 3), "orvix-hostsim: host store '" + db + "' is not an SQLite database or is damaged\n");
     EXPECT_EQ(Failure({"init"}, 1), "orvix-hostsim: host store '" + db + "' exists; use --force to replace it\n");
     const Result forced = Run({"init", "--force", "--profile", fixture});
@@ -68,12 +69,12 @@ TEST_F(HostsimTest, InitDumpAndForce) {
 TEST_F(HostsimTest, LoadReplacesOrCreates) {
     EXPECT_EQ(Run({"load", fixture}).status, 0);  // creates the store
     EXPECT_EQ(Run({"dump"}).out, fixtureDump);
-    StoreTest::WriteFile(dir / "empty.json", StoreTest::EmptyProfileText());
+    OrvixTest::WriteFile(dir / "empty.json", StoreTest::EmptyProfileText());
     EXPECT_EQ(Run({"load", dir / "empty.json"}).status, 0);
     EXPECT_EQ(Run({"dump"}).out, emptyDump);
 
     // A bad profile fails the request and changes nothing.
-    StoreTest::WriteFile(dir / "bad.json", R"({"format": "orvix-host-profile", "version": 1, "worlds": [{"id": []}]})");
+    OrvixTest::WriteFile(dir / "bad.json", R"({"format": "orvix-host-profile", "version": 1, "worlds": [{"id": []}]})");
     EXPECT_EQ(Failure({"load", dir / "bad.json"}, 1),
               "orvix-hostsim: profile " + (dir / "bad.json") +
                   ": worlds[0]: field 'id' must be a string or an integer, not array\n");
@@ -139,11 +140,11 @@ TEST_F(HostsimTest, UsageErrorsAndHelp) {
 }
 
 TEST_F(HostsimTest, PathFollowsOptionAndEnvironment) {
-    StoreTest::ScopedEnv env("ORVIX_HOST_DB", dir / "env.db");
+    OrvixTest::ScopedEnv env("ORVIX_HOST_DB", dir / "env.db");
     EXPECT_EQ(RunBare({"path"}).out, (dir / "env.db") + "\n");
     EXPECT_EQ(Run({"path"}).out, db + "\n");
     // The first use creates the host from ORVIX_HOST_PROFILE.
-    StoreTest::ScopedEnv profile("ORVIX_HOST_PROFILE", fixture);
+    OrvixTest::ScopedEnv profile("ORVIX_HOST_PROFILE", fixture);
     EXPECT_EQ(RunBare({"dump"}).out, fixtureDump);
     EXPECT_TRUE(std::filesystem::exists(dir / "env.db"));
 }

@@ -7,13 +7,14 @@
 #include <set>
 #include <thread>
 
-#include "reliability_util.h"
+#include "support/process.h"
+#include "support/store_test_util.h"
 
 namespace {
 
+using OrvixTest::Bin;
+using OrvixTest::Process;
 using PldCtl::Store::HostStore;
-using Reliability::Bin;
-using Reliability::Process;
 
 // The counter the stress program keeps in the "system" singleton.
 std::int64_t Counter(HostStore& store) {
@@ -23,7 +24,7 @@ std::int64_t Counter(HostStore& store) {
 TEST(StoreConcurrencyTest, ConcurrentReadModifyWriteLosesNothing) {
     constexpr int kProcesses = 8;
     constexpr int kChanges = 50;
-    StoreTest::TempDir dir;
+    OrvixTest::TempDir dir;
     const std::string db = dir / "host.db";
     HostStore::Create(db, StoreTest::EmptyProfileText());
 
@@ -63,7 +64,7 @@ std::int64_t LastNumber(const std::string& output, std::int64_t otherwise) {
 
 TEST(StoreConcurrencyTest, KilledWritersLeaveAWholeStore) {
     constexpr int kRounds = 50;
-    StoreTest::TempDir dir;
+    OrvixTest::TempDir dir;
     const std::string db = dir / "host.db";
     HostStore::Create(db, StoreTest::EmptyProfileText());
     std::mt19937 random(20240611);

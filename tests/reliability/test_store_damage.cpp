@@ -5,7 +5,8 @@
 
 #include <random>
 
-#include "reliability_util.h"
+#include "support/process.h"
+#include "support/store_test_util.h"
 
 namespace {
 
@@ -16,10 +17,10 @@ struct DamagedFile {
     std::string bytes;
 };
 
-std::vector<DamagedFile> DamagedFiles(const StoreTest::TempDir& dir) {
+std::vector<DamagedFile> DamagedFiles(const OrvixTest::TempDir& dir) {
     const std::string real = dir / "real.db";
     HostStore::Create(real, StoreTest::Fixture("small-host.json"), "small-host.json");
-    const std::string store = StoreTest::ReadFile(real);
+    const std::string store = OrvixTest::ReadFile(real);
     unlink(real.c_str());
 
     std::mt19937 random(7);
@@ -30,7 +31,7 @@ std::vector<DamagedFile> DamagedFiles(const StoreTest::TempDir& dir) {
     StoreTest::RawSql(foreign,
                       "CREATE TABLE accounts(id INTEGER PRIMARY KEY, owner TEXT); "
                       "INSERT INTO accounts(owner) VALUES ('someone')");
-    const std::string foreignBytes = StoreTest::ReadFile(foreign);
+    const std::string foreignBytes = OrvixTest::ReadFile(foreign);
     unlink(foreign.c_str());
 
     return {{"half.db", store.substr(0, store.size() / 2)},
@@ -41,11 +42,11 @@ std::vector<DamagedFile> DamagedFiles(const StoreTest::TempDir& dir) {
 }
 
 TEST(StoreDamageTest, DamagedFilesAreRefusedAndLeftAlone) {
-    StoreTest::TempDir dir;
+    OrvixTest::TempDir dir;
     for (const auto& file : DamagedFiles(dir)) {
         SCOPED_TRACE(file.name);
         const std::string path = dir / file.name;
-        StoreTest::WriteFile(path, file.bytes);
+        OrvixTest::WriteFile(path, file.bytes);
 
         try {
             HostStore::Open(path);
@@ -53,16 +54,16 @@ TEST(StoreDamageTest, DamagedFilesAreRefusedAndLeftAlone) {
         } catch (const PldCtl::Store::StoreError& e) {
             EXPECT_EQ(std::string(e.what()).rfind("host store '" + path + "' ", 0), 0u) << e.what();
         }
-        EXPECT_EQ(StoreTest::ReadFile(path), file.bytes);
+        EXPECT_EQ(OrvixTest::ReadFile(path), file.bytes);
 
-        Reliability::Process dump(Reliability::Bin("orvix-hostsim"), {"--db", path, "dump"}, dir / "out", dir / "err");
+        OrvixTest::Process dump(OrvixTest::Bin("orvix-hostsim"), {"--db", path, "dump"}, dir / "out", dir / "err");
         const int status = dump.Wait();
         EXPECT_TRUE(WIFEXITED(status) && WEXITSTATUS(status) == 3) << "status " << status;
         EXPECT_EQ(dump.Out(), "");
         const std::string err = dump.Err();
         EXPECT_EQ(err.rfind("orvix-hostsim: host store '" + path + "' ", 0), 0u) << err;
         EXPECT_EQ(std::count(err.begin(), err.end(), '\n'), 1) << err;
-        EXPECT_EQ(StoreTest::ReadFile(path), file.bytes);
+        EXPECT_EQ(OrvixTest::ReadFile(path), file.bytes);
         // Neither left a side file behind.
         EXPECT_FALSE(std::filesystem::exists(path + "-wal"));
         EXPECT_FALSE(std::filesystem::exists(path + "-shm"));

@@ -43,9 +43,9 @@ protected:
         return "(no error)";
     }
 
-    StoreTest::TempDir dir_;
-    StoreTest::ScopedEnv db_;
-    StoreTest::ScopedEnv profile_;
+    OrvixTest::TempDir dir_;
+    OrvixTest::ScopedEnv db_;
+    OrvixTest::ScopedEnv profile_;
     VirtualSwitchInfoImpl info_;
 };
 

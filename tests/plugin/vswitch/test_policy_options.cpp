@@ -45,9 +45,9 @@ protected:
         return output->GetErrors();
     }
 
-    StoreTest::TempDir dir_;
-    StoreTest::ScopedEnv db_;
-    StoreTest::ScopedEnv profile_;
+    OrvixTest::TempDir dir_;
+    OrvixTest::ScopedEnv db_;
+    OrvixTest::ScopedEnv profile_;
 };
 
 TEST(SplitUplinks, KeepsEveryPieceBeforeACommaAndANonEmptyLastPiece) {

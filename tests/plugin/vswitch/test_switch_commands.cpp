@@ -63,9 +63,9 @@ protected:
         return vswitch;
     }
 
-    StoreTest::TempDir dir_;
-    StoreTest::ScopedEnv db_;
-    StoreTest::ScopedEnv profile_;
+    OrvixTest::TempDir dir_;
+    OrvixTest::ScopedEnv db_;
+    OrvixTest::ScopedEnv profile_;
 };
 
 TEST_F(SwitchCommands, EveryRunEndsWithAResultAndOneCompleteOrWithAnErrorAlone) {

@@ -44,10 +44,8 @@ $ orvixcli network ip set -e false
 
 $ orvixcli network ip set -e YES
 
-$ orvixcli network ip get --formatter=json
-{
-  "IPv6 Enabled": true
-}
+$ orvixcli network ip get --formatter=keyvalue
+IPInfo.IPv6 Enabled=true
 
 ## A bad value is refused before anything runs.
 $ orvixcli network ip set --ipv6-enabled=maybe

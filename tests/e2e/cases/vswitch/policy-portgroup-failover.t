@@ -69,30 +69,10 @@ $ orvixcli network vswitch standard portgroup policy failover get -p "Management
    Override Vswitch Failback: false
    Override Vswitch Uplinks: true
 
-## --use-vswitch alone clears every override.
+## --use-vswitch alone clears every override; from then on every setting
+## follows the switch.
 $ orvixcli network vswitch standard portgroup policy failover set -p "Management Network" --use-vswitch
 
-$ orvixcli network vswitch standard portgroup policy failover get -p "Management Network" --formatter=json
-{
-  "Load Balancing": "srcport",
-  "Network Failure Detection": "link",
-  "Notify Switches": true,
-  "Failback": true,
-  "Active Adapters": [
-    "hwnic0"
-  ],
-  "Standby Adapters": [
-    "hwnic1"
-  ],
-  "Unused Adapters": [],
-  "Override Vswitch Load Balancing": false,
-  "Override Vswitch Network Failure Detection": false,
-  "Override Vswitch Notify Switches": false,
-  "Override Vswitch Failback": false,
-  "Override Vswitch Uplinks": false
-}
-
-## An inherited setting follows the switch.
 $ orvixcli network vswitch standard policy failover set -v vSwitch0 --load-balancing=iphash --notify-switches=false
 
 $ orvixcli network vswitch standard portgroup policy failover get -p "Management Network"
@@ -156,25 +136,18 @@ true
 ! some NICs appear in the input for more than once.
 [1]
 
-$ orvixcli network vswitch standard portgroup policy failover get -p "VM Network" --formatter=json
-{
-  "Load Balancing": "iphash",
-  "Network Failure Detection": "beacon",
-  "Notify Switches": false,
-  "Failback": true,
-  "Active Adapters": [],
-  "Standby Adapters": [
-    "hwnic1"
-  ],
-  "Unused Adapters": [
-    "hwnic0"
-  ],
-  "Override Vswitch Load Balancing": false,
-  "Override Vswitch Network Failure Detection": true,
-  "Override Vswitch Notify Switches": false,
-  "Override Vswitch Failback": false,
-  "Override Vswitch Uplinks": true
-}
+$ orvixcli network vswitch standard portgroup policy failover get -p "VM Network" --formatter=keyvalue
+PortGroupFailoverPolicy.Load Balancing=iphash
+PortGroupFailoverPolicy.Network Failure Detection=beacon
+PortGroupFailoverPolicy.Notify Switches=false
+PortGroupFailoverPolicy.Failback=true
+PortGroupFailoverPolicy.Standby Adapters[0]=hwnic1
+PortGroupFailoverPolicy.Unused Adapters[0]=hwnic0
+PortGroupFailoverPolicy.Override Vswitch Load Balancing=false
+PortGroupFailoverPolicy.Override Vswitch Network Failure Detection=true
+PortGroupFailoverPolicy.Override Vswitch Notify Switches=false
+PortGroupFailoverPolicy.Override Vswitch Failback=false
+PortGroupFailoverPolicy.Override Vswitch Uplinks=true
 
 $ orvixcli network vswitch standard portgroup policy failover get -p "VM network"
 ! Unable to find a port group with the name VM network

@@ -45,15 +45,13 @@ $ orvixcli network vswitch standard portgroup policy security get -p "VM Network
 
 $ orvixcli network vswitch standard portgroup policy security set -p "VM Network" --use-vswitch
 
-$ orvixcli network vswitch standard portgroup policy security get -p "VM Network" --formatter=json
-{
-  "Allow Promiscuous": false,
-  "Allow MAC Address Change": true,
-  "Allow Forged Transmits": true,
-  "Override Vswitch Allow Promiscuous": false,
-  "Override Vswitch Allow MAC Address Change": false,
-  "Override Vswitch Allow Forged Transmits": false
-}
+$ orvixcli network vswitch standard portgroup policy security get -p "VM Network" --formatter=keyvalue
+PortGroupSecurityPolicy.Allow Promiscuous=false
+PortGroupSecurityPolicy.Allow MAC Address Change=true
+PortGroupSecurityPolicy.Allow Forged Transmits=true
+PortGroupSecurityPolicy.Override Vswitch Allow Promiscuous=false
+PortGroupSecurityPolicy.Override Vswitch Allow MAC Address Change=false
+PortGroupSecurityPolicy.Override Vswitch Allow Forged Transmits=false
 
 $ orvixcli network vswitch standard portgroup policy security set -p "Lab Isolated" -u -m true
 

@@ -17,17 +17,15 @@ $ orvixcli network vswitch standard portgroup policy shaping set -p Half --avg-b
 ! Unable to set shaping policy. A Burst Size value must be set on either this port group or on the parent virtual switch.
 [1]
 
-$ orvixcli network vswitch standard portgroup policy shaping get -p Half --formatter=json
-{
-  "Enabled": true,
-  "Average Bandwidth": 100000,
-  "Peak Bandwidth": 5,
-  "Burst Size": 819200,
-  "Override Vswitch Enabled": true,
-  "Override Vswitch Average Bandwidth": false,
-  "Override Vswitch Peak Bandwidth": true,
-  "Override Vswitch Burst Size": false
-}
+$ orvixcli network vswitch standard portgroup policy shaping get -p Half --formatter=keyvalue
+PortGroupTrafficShapingPolicy.Enabled=true
+PortGroupTrafficShapingPolicy.Average Bandwidth=100000
+PortGroupTrafficShapingPolicy.Peak Bandwidth=5
+PortGroupTrafficShapingPolicy.Burst Size=819200
+PortGroupTrafficShapingPolicy.Override Vswitch Enabled=true
+PortGroupTrafficShapingPolicy.Override Vswitch Average Bandwidth=false
+PortGroupTrafficShapingPolicy.Override Vswitch Peak Bandwidth=true
+PortGroupTrafficShapingPolicy.Override Vswitch Burst Size=false
 
 ## Once the switch stores its values (even with shaping off), they count.
 $ orvixcli network vswitch standard policy shaping set -v vSwitch0 --enabled=true --avg-bandwidth=100 --peak-bandwidth=200 --burst-size=300

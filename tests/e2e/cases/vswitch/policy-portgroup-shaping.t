@@ -69,17 +69,15 @@ $ orvixcli network vswitch standard portgroup policy shaping get -p "Lab Isolate
 ## --use-vswitch alone gives everything back to the switch.
 $ orvixcli network vswitch standard portgroup policy shaping set -p Storage --use-vswitch
 
-$ orvixcli network vswitch standard portgroup policy shaping get -p Storage --formatter=json
-{
-  "Enabled": false,
-  "Average Bandwidth": -1,
-  "Peak Bandwidth": -1,
-  "Burst Size": -1,
-  "Override Vswitch Enabled": false,
-  "Override Vswitch Average Bandwidth": false,
-  "Override Vswitch Peak Bandwidth": false,
-  "Override Vswitch Burst Size": false
-}
+$ orvixcli network vswitch standard portgroup policy shaping get -p Storage --formatter=keyvalue
+PortGroupTrafficShapingPolicy.Enabled=false
+PortGroupTrafficShapingPolicy.Average Bandwidth=-1
+PortGroupTrafficShapingPolicy.Peak Bandwidth=-1
+PortGroupTrafficShapingPolicy.Burst Size=-1
+PortGroupTrafficShapingPolicy.Override Vswitch Enabled=false
+PortGroupTrafficShapingPolicy.Override Vswitch Average Bandwidth=false
+PortGroupTrafficShapingPolicy.Override Vswitch Peak Bandwidth=false
+PortGroupTrafficShapingPolicy.Override Vswitch Burst Size=false
 
 $ orvixcli network vswitch standard portgroup policy shaping set -p Storage -u -e true -b 100 -k 200 -t 300
 
@@ -99,17 +97,15 @@ true
 ! Value of --avg-bandwidth is too large
 [1]
 
-$ orvixcli network vswitch standard portgroup policy shaping get -p Storage --formatter=json
-{
-  "Enabled": true,
-  "Average Bandwidth": 100,
-  "Peak Bandwidth": 200,
-  "Burst Size": 300,
-  "Override Vswitch Enabled": true,
-  "Override Vswitch Average Bandwidth": true,
-  "Override Vswitch Peak Bandwidth": true,
-  "Override Vswitch Burst Size": true
-}
+$ orvixcli network vswitch standard portgroup policy shaping get -p Storage --formatter=keyvalue
+PortGroupTrafficShapingPolicy.Enabled=true
+PortGroupTrafficShapingPolicy.Average Bandwidth=100
+PortGroupTrafficShapingPolicy.Peak Bandwidth=200
+PortGroupTrafficShapingPolicy.Burst Size=300
+PortGroupTrafficShapingPolicy.Override Vswitch Enabled=true
+PortGroupTrafficShapingPolicy.Override Vswitch Average Bandwidth=true
+PortGroupTrafficShapingPolicy.Override Vswitch Peak Bandwidth=true
+PortGroupTrafficShapingPolicy.Override Vswitch Burst Size=true
 
 $ orvixcli network vswitch standard portgroup policy shaping get -p Nowhere
 ! Unable to find a port group with the name Nowhere

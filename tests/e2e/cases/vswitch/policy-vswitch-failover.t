@@ -5,16 +5,7 @@
 
 ## vSwitch0 orders hwnic0 (active), hwnic1, hwnic2 (standby); hwnic3 is an
 ## uplink in no list.
-$ orvixcli network vswitch standard policy failover get --vswitch-name=vSwitch0
-   Load Balancing: srcport
-   Network Failure Detection: link
-   Notify Switches: true
-   Failback: true
-   Active Adapters: hwnic0
-   Standby Adapters: hwnic1, hwnic2
-   Unused Adapters: hwnic3
-
-$ orvixcli network vswitch standard policy failover get -v vSwitch0 --formatter=json
+$ orvixcli network vswitch standard policy failover get --vswitch-name=vSwitch0 --formatter=json
 {
   "Load Balancing": "srcport",
   "Network Failure Detection": "link",
@@ -45,23 +36,15 @@ $ orvixcli network vswitch standard policy failover get -v vSwitch1
 ## The load-balancing word "mac" is shown as "srcmac", "portid" as "srcport".
 $ orvixcli network vswitch standard policy failover set -v vSwitch0 --load-balancing=mac --failure-detection=beacon --notify-switches=false --failback=false
 
-$ orvixcli network vswitch standard policy failover get -v vSwitch0 --formatter=json
-{
-  "Load Balancing": "srcmac",
-  "Network Failure Detection": "beacon",
-  "Notify Switches": false,
-  "Failback": false,
-  "Active Adapters": [
-    "hwnic0"
-  ],
-  "Standby Adapters": [
-    "hwnic1",
-    "hwnic2"
-  ],
-  "Unused Adapters": [
-    "hwnic3"
-  ]
-}
+$ orvixcli network vswitch standard policy failover get -v vSwitch0 --formatter=keyvalue
+VirtualSwitchFailoverPolicy.Load Balancing=srcmac
+VirtualSwitchFailoverPolicy.Network Failure Detection=beacon
+VirtualSwitchFailoverPolicy.Notify Switches=false
+VirtualSwitchFailoverPolicy.Failback=false
+VirtualSwitchFailoverPolicy.Active Adapters[0]=hwnic0
+VirtualSwitchFailoverPolicy.Standby Adapters[0]=hwnic1
+VirtualSwitchFailoverPolicy.Standby Adapters[1]=hwnic2
+VirtualSwitchFailoverPolicy.Unused Adapters[0]=hwnic3
 
 $ orvixcli network vswitch standard policy failover set -v vSwitch0 -l portid -f link -n true -b true
 
@@ -76,23 +59,15 @@ $ orvixcli network vswitch standard policy failover get -v vSwitch0
 
 $ orvixcli network vswitch standard policy failover set -v vSwitch0 -l iphash
 
-$ orvixcli network vswitch standard policy failover get -v vSwitch0 --formatter=json
-{
-  "Load Balancing": "iphash",
-  "Network Failure Detection": "link",
-  "Notify Switches": true,
-  "Failback": true,
-  "Active Adapters": [
-    "hwnic0"
-  ],
-  "Standby Adapters": [
-    "hwnic1",
-    "hwnic2"
-  ],
-  "Unused Adapters": [
-    "hwnic3"
-  ]
-}
+$ orvixcli network vswitch standard policy failover get -v vSwitch0 --formatter=keyvalue
+VirtualSwitchFailoverPolicy.Load Balancing=iphash
+VirtualSwitchFailoverPolicy.Network Failure Detection=link
+VirtualSwitchFailoverPolicy.Notify Switches=true
+VirtualSwitchFailoverPolicy.Failback=true
+VirtualSwitchFailoverPolicy.Active Adapters[0]=hwnic0
+VirtualSwitchFailoverPolicy.Standby Adapters[0]=hwnic1
+VirtualSwitchFailoverPolicy.Standby Adapters[1]=hwnic2
+VirtualSwitchFailoverPolicy.Unused Adapters[0]=hwnic3
 
 $ orvixcli network vswitch standard policy failover set -v vSwitch0 -l explicit
 
@@ -124,22 +99,15 @@ $ orvixcli network vswitch standard policy failover get -v vSwitch0
 
 $ orvixcli network vswitch standard policy failover set -v vSwitch0 --standby-uplinks=hwnic1
 
-$ orvixcli network vswitch standard policy failover get -v vSwitch0 --formatter=json
-{
-  "Load Balancing": "explicit",
-  "Network Failure Detection": "link",
-  "Notify Switches": true,
-  "Failback": true,
-  "Active Adapters": [],
-  "Standby Adapters": [
-    "hwnic1"
-  ],
-  "Unused Adapters": [
-    "hwnic0",
-    "hwnic2",
-    "hwnic3"
-  ]
-}
+$ orvixcli network vswitch standard policy failover get -v vSwitch0 --formatter=keyvalue
+VirtualSwitchFailoverPolicy.Load Balancing=explicit
+VirtualSwitchFailoverPolicy.Network Failure Detection=link
+VirtualSwitchFailoverPolicy.Notify Switches=true
+VirtualSwitchFailoverPolicy.Failback=true
+VirtualSwitchFailoverPolicy.Standby Adapters[0]=hwnic1
+VirtualSwitchFailoverPolicy.Unused Adapters[0]=hwnic0
+VirtualSwitchFailoverPolicy.Unused Adapters[1]=hwnic2
+VirtualSwitchFailoverPolicy.Unused Adapters[2]=hwnic3
 
 ## Both lists make the whole order.
 $ orvixcli network vswitch standard policy failover set -v vSwitch0 -a hwnic2,hwnic0 -s hwnic1

@@ -23,12 +23,10 @@ $ orvixcli network vswitch standard policy security get -v vSwitch0
 $ orvixcli network vswitch standard policy security set -v vSwitch0 --allow-mac-change=false --formatter=json
 true
 
-$ orvixcli network vswitch standard policy security get -v vSwitch0 --formatter=json
-{
-  "Allow Promiscuous": true,
-  "Allow MAC Address Change": false,
-  "Allow Forged Transmits": false
-}
+$ orvixcli network vswitch standard policy security get -v vSwitch0 --formatter=keyvalue
+VirtualSwitchSecurityPolicy.Allow Promiscuous=true
+VirtualSwitchSecurityPolicy.Allow MAC Address Change=false
+VirtualSwitchSecurityPolicy.Allow Forged Transmits=false
 
 ## No option writes the policy back unchanged.
 $ orvixcli network vswitch standard policy security set -v vSwitch1

@@ -54,13 +54,11 @@ $ orvixcli network vswitch standard policy shaping get -v vSwitch1
 ## An enabled policy takes one value alone.
 $ orvixcli network vswitch standard policy shaping set -v vSwitch0 --peak-bandwidth=7
 
-$ orvixcli network vswitch standard policy shaping get -v vSwitch0 --formatter=json
-{
-  "Enabled": true,
-  "Average Bandwidth": 1,
-  "Peak Bandwidth": 7,
-  "Burst Size": 1
-}
+$ orvixcli network vswitch standard policy shaping get -v vSwitch0 --formatter=keyvalue
+VirtualSwitchTrafficShapingPolicy.Enabled=true
+VirtualSwitchTrafficShapingPolicy.Average Bandwidth=1
+VirtualSwitchTrafficShapingPolicy.Peak Bandwidth=7
+VirtualSwitchTrafficShapingPolicy.Burst Size=1
 
 ## The largest values that still fit the host's 64 bits are kept exactly;
 ## one more is refused.

@@ -17,9 +17,20 @@ Lab Isolated        vSwitch1        0               100
 Backup Net          vSwitch1        0               0
 Lab2                vSwitch1        0               0
 
-$ orvixcli network vswitch standard list -v vSwitch1 --formatter=csv
-Name,Class,Num Ports,Used Ports,Configured Ports,MTU,CDP Status,Beacon Enabled,Beacon Interval,Beacon Threshold,Beacon Required By,Uplinks,Portgroups
-vSwitch1,stdswitch,64,0,1,9000,down,false,1,3,,,"Lab Isolated,Backup Net,Lab2"
+$ orvixcli network vswitch standard list -v vSwitch1 --formatter=keyvalue
+VirtualSwitch[0].Name=vSwitch1
+VirtualSwitch[0].Class=stdswitch
+VirtualSwitch[0].Num Ports=64
+VirtualSwitch[0].Used Ports=0
+VirtualSwitch[0].Configured Ports=1
+VirtualSwitch[0].MTU=9000
+VirtualSwitch[0].CDP Status=down
+VirtualSwitch[0].Beacon Enabled=false
+VirtualSwitch[0].Beacon Interval=1
+VirtualSwitch[0].Beacon Threshold=3
+VirtualSwitch[0].Portgroups[0]=Lab Isolated
+VirtualSwitch[0].Portgroups[1]=Backup Net
+VirtualSwitch[0].Portgroups[2]=Lab2
 
 ## Port group names are unique on the whole host, not only on one switch.
 $ orvixcli network vswitch standard portgroup add -p Storage -v vSwitch1
@@ -71,39 +82,14 @@ $ orvixcli network vswitch standard portgroup remove --portgroup-name=Lab2 --vsw
 $ orvixcli network vswitch standard portgroup remove -p "Lab Isolated" -v vSwitch1 --formatter=json
 true
 
-$ orvixcli network vswitch standard portgroup list --formatter=json
-[
-  {
-    "Name": "Management Network",
-    "Virtual Switch": "vSwitch0",
-    "Active Clients": 1,
-    "VLAN ID": 0
-  },
-  {
-    "Name": "VM Network",
-    "Virtual Switch": "vSwitch0",
-    "Active Clients": 2,
-    "VLAN ID": 0
-  },
-  {
-    "Name": "Storage",
-    "Virtual Switch": "vSwitch0",
-    "Active Clients": 1,
-    "VLAN ID": 20
-  },
-  {
-    "Name": "Migration",
-    "Virtual Switch": "vSwitch0",
-    "Active Clients": 1,
-    "VLAN ID": 30
-  },
-  {
-    "Name": "Backup Net",
-    "Virtual Switch": "vSwitch1",
-    "Active Clients": 0,
-    "VLAN ID": 0
-  }
-]
+$ orvixcli network vswitch standard portgroup list
+Name                Virtual Switch  Active Clients  VLAN ID
+------------------  --------------  --------------  -------
+Management Network  vSwitch0        1               0
+VM Network          vSwitch0        2               0
+Storage             vSwitch0        1               20
+Migration           vSwitch0        1               30
+Backup Net          vSwitch1        0               0
 
 $ orvixcli network vswitch standard portgroup add --help
 Usage: orvixcli network vswitch standard portgroup add [cmd options]

@@ -34,39 +34,14 @@ $ orvixcli network vswitch standard portgroup set -p "Lab Isolated"
 $ orvixcli network vswitch standard portgroup set -p "Lab Isolated" --formatter=json
 true
 
-$ orvixcli network vswitch standard portgroup list --formatter=json
-[
-  {
-    "Name": "Management Network",
-    "Virtual Switch": "vSwitch0",
-    "Active Clients": 1,
-    "VLAN ID": 0
-  },
-  {
-    "Name": "VM Network",
-    "Virtual Switch": "vSwitch0",
-    "Active Clients": 2,
-    "VLAN ID": 42
-  },
-  {
-    "Name": "Storage",
-    "Virtual Switch": "vSwitch0",
-    "Active Clients": 1,
-    "VLAN ID": 4095
-  },
-  {
-    "Name": "Migration",
-    "Virtual Switch": "vSwitch0",
-    "Active Clients": 1,
-    "VLAN ID": 0
-  },
-  {
-    "Name": "Lab Isolated",
-    "Virtual Switch": "vSwitch1",
-    "Active Clients": 0,
-    "VLAN ID": 100
-  }
-]
+$ orvixcli network vswitch standard portgroup list
+Name                Virtual Switch  Active Clients  VLAN ID
+------------------  --------------  --------------  -------
+Management Network  vSwitch0        1               0
+VM Network          vSwitch0        2               42
+Storage             vSwitch0        1               4095
+Migration           vSwitch0        1               0
+Lab Isolated        vSwitch1        0               100
 
 ## A port group the host does not have, with or without a VLAN ID.
 $ orvixcli network vswitch standard portgroup set -p "VM network" -v 7

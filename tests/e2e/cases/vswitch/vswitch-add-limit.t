@@ -10,39 +10,10 @@ $ orvixcli network vswitch standard add --vswitch-name=one --ports=1
 ! Unable to create virtual switch one with 1 port: 4608 of the host's 4608 ports are allocated already
 [1]
 
-$ orvixcli network vswitch standard list --formatter=json
-[
-  {
-    "Name": "big",
-    "Class": "stdswitch",
-    "Num Ports": 4096,
-    "Used Ports": 0,
-    "Configured Ports": 0,
-    "MTU": 1500,
-    "CDP Status": "listen",
-    "Beacon Enabled": false,
-    "Beacon Interval": 1,
-    "Beacon Threshold": 3,
-    "Beacon Required By": [],
-    "Uplinks": [],
-    "Portgroups": []
-  },
-  {
-    "Name": "rest",
-    "Class": "stdswitch",
-    "Num Ports": 512,
-    "Used Ports": 0,
-    "Configured Ports": 0,
-    "MTU": 1500,
-    "CDP Status": "listen",
-    "Beacon Enabled": false,
-    "Beacon Interval": 1,
-    "Beacon Threshold": 3,
-    "Beacon Required By": [],
-    "Uplinks": [],
-    "Portgroups": []
-  }
-]
+## The refused switch was not created.
+$ orvixcli network vswitch standard list -v one --formatter=keyvalue
+! Unable to access all portsets
+[1]
 
 ## Removing a switch gives its ports back to the host.
 $ orvixcli network vswitch standard remove --vswitch-name=rest

@@ -3,52 +3,33 @@
 ## default policies; a successful add prints nothing in simple output.
 $ orvixcli network vswitch standard add --vswitch-name=vSwitch2
 
-$ orvixcli network vswitch standard list -v vSwitch2
-vSwitch2
-   Name: vSwitch2
-   Class: stdswitch
-   Num Ports: 128
-   Used Ports: 0
-   Configured Ports: 0
-   MTU: 1500
-   CDP Status: listen
-   Beacon Enabled: false
-   Beacon Interval: 1
-   Beacon Threshold: 3
-   Beacon Required By: 
-   Uplinks: 
-   Portgroups: 
+$ orvixcli network vswitch standard list -v vSwitch2 --formatter=keyvalue
+VirtualSwitch[0].Name=vSwitch2
+VirtualSwitch[0].Class=stdswitch
+VirtualSwitch[0].Num Ports=128
+VirtualSwitch[0].Used Ports=0
+VirtualSwitch[0].Configured Ports=0
+VirtualSwitch[0].MTU=1500
+VirtualSwitch[0].CDP Status=listen
+VirtualSwitch[0].Beacon Enabled=false
+VirtualSwitch[0].Beacon Interval=1
+VirtualSwitch[0].Beacon Threshold=3
 
 ## In JSON the operation's result is the boolean true.
 $ orvixcli network vswitch standard add -v vSwitch3 -P 16 --formatter=json
 true
 
-$ orvixcli network vswitch standard list -v vSwitch3 --formatter=json
-[
-  {
-    "Name": "vSwitch3",
-    "Class": "stdswitch",
-    "Num Ports": 16,
-    "Used Ports": 0,
-    "Configured Ports": 0,
-    "MTU": 1500,
-    "CDP Status": "listen",
-    "Beacon Enabled": false,
-    "Beacon Interval": 1,
-    "Beacon Threshold": 3,
-    "Beacon Required By": [],
-    "Uplinks": [],
-    "Portgroups": []
-  }
-]
-
-## New switches are listed after the ones the host had.
-$ orvixcli network vswitch standard list --formatter=csv
-Name,Class,Num Ports,Used Ports,Configured Ports,MTU,CDP Status,Beacon Enabled,Beacon Interval,Beacon Threshold,Beacon Required By,Uplinks,Portgroups
-vSwitch0,stdswitch,128,7,8,1500,listen,false,1,3,Migration,"hwnic0,hwnic1","Management Network,VM Network,Storage,Migration"
-vSwitch1,stdswitch,64,0,1,9000,down,false,1,3,,,Lab Isolated
-vSwitch2,stdswitch,128,0,0,1500,listen,false,1,3,,,
-vSwitch3,stdswitch,16,0,0,1500,listen,false,1,3,,,
+$ orvixcli network vswitch standard list -v vSwitch3 --formatter=keyvalue
+VirtualSwitch[0].Name=vSwitch3
+VirtualSwitch[0].Class=stdswitch
+VirtualSwitch[0].Num Ports=16
+VirtualSwitch[0].Used Ports=0
+VirtualSwitch[0].Configured Ports=0
+VirtualSwitch[0].MTU=1500
+VirtualSwitch[0].CDP Status=listen
+VirtualSwitch[0].Beacon Enabled=false
+VirtualSwitch[0].Beacon Interval=1
+VirtualSwitch[0].Beacon Threshold=3
 
 ## A name in use is refused by the library, with its message.
 $ orvixcli network vswitch standard add --vswitch-name=vSwitch0
@@ -86,7 +67,8 @@ $ orvixcli network vswitch standard add --vswitch-name="my switch"
 ! Invalid virtual switch name 'my switch': use 1 to 32 letters, digits, '.', '-' or '_'
 [1]
 
-## Nothing of the refused switches was created.
+## Nothing of the refused switches was created; the new ones are listed after
+## the ones the host had.
 $ orvixcli network vswitch standard list --formatter=csv
 Name,Class,Num Ports,Used Ports,Configured Ports,MTU,CDP Status,Beacon Enabled,Beacon Interval,Beacon Threshold,Beacon Required By,Uplinks,Portgroups
 vSwitch0,stdswitch,128,7,8,1500,listen,false,1,3,Migration,"hwnic0,hwnic1","Management Network,VM Network,Storage,Migration"

@@ -17,25 +17,3 @@ vSwitch0
    Beacon Required By: 
    Uplinks: hwnic0, hwnic1
    Portgroups: 
-
-$ orvixcli network vswitch standard list --formatter=json
-[
-  {
-    "Name": "vSwitch0",
-    "Class": "stdswitch",
-    "Num Ports": 32,
-    "Used Ports": 3,
-    "Configured Ports": 3,
-    "MTU": 1500,
-    "CDP Status": "both",
-    "Beacon Enabled": false,
-    "Beacon Interval": 1,
-    "Beacon Threshold": 3,
-    "Beacon Required By": [],
-    "Uplinks": [
-      "hwnic0",
-      "hwnic1"
-    ],
-    "Portgroups": []
-  }
-]

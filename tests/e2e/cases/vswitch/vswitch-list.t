@@ -54,35 +54,6 @@ $ orvixcli network vswitch standard list --vswitch-name=vSwitch1 --formatter=jso
   }
 ]
 
-$ orvixcli network vswitch standard list -v vSwitch0 --formatter=json
-[
-  {
-    "Name": "vSwitch0",
-    "Class": "stdswitch",
-    "Num Ports": 128,
-    "Used Ports": 7,
-    "Configured Ports": 8,
-    "MTU": 1500,
-    "CDP Status": "listen",
-    "Beacon Enabled": false,
-    "Beacon Interval": 1,
-    "Beacon Threshold": 3,
-    "Beacon Required By": [
-      "Migration"
-    ],
-    "Uplinks": [
-      "hwnic0",
-      "hwnic1"
-    ],
-    "Portgroups": [
-      "Management Network",
-      "VM Network",
-      "Storage",
-      "Migration"
-    ]
-  }
-]
-
 ## A name no switch has: the walk stops at once. The (empty) list is still
 ## the result, and the error goes to stderr.
 $ orvixcli network vswitch standard list --vswitch-name=vSwitch9

@@ -1,11 +1,7 @@
 ## network vswitch standard set: MTU and CDP status of a switch.
 $ orvixcli network vswitch standard set --vswitch-name=vSwitch1 --mtu=1280
 
-$ orvixcli network vswitch standard list -v vSwitch1 --formatter=csv
-Name,Class,Num Ports,Used Ports,Configured Ports,MTU,CDP Status,Beacon Enabled,Beacon Interval,Beacon Threshold,Beacon Required By,Uplinks,Portgroups
-vSwitch1,stdswitch,64,0,1,1280,down,false,1,3,,,Lab Isolated
-
-## A negative MTU is refused by the command; nothing changes.
+## A negative MTU is refused by the command.
 $ orvixcli network vswitch standard set --vswitch-name=vSwitch1 --mtu=-1
 ! MTU size should be a positive value
 [1]
@@ -25,78 +21,110 @@ $ orvixcli network vswitch standard set --vswitch-name=vSwitch1 --mtu=4294968576
 ! Invalid MTU 4294968576 for virtual switch vSwitch1: it must be between 1280 and 9000
 [1]
 
-$ orvixcli network vswitch standard list -v vSwitch1 --formatter=csv
-Name,Class,Num Ports,Used Ports,Configured Ports,MTU,CDP Status,Beacon Enabled,Beacon Interval,Beacon Threshold,Beacon Required By,Uplinks,Portgroups
-vSwitch1,stdswitch,64,0,1,1280,down,false,1,3,,,Lab Isolated
+## The first MTU was written, none of the refused ones.
+$ orvixcli network vswitch standard list -v vSwitch1 --formatter=keyvalue
+VirtualSwitch[0].Name=vSwitch1
+VirtualSwitch[0].Class=stdswitch
+VirtualSwitch[0].Num Ports=64
+VirtualSwitch[0].Used Ports=0
+VirtualSwitch[0].Configured Ports=1
+VirtualSwitch[0].MTU=1280
+VirtualSwitch[0].CDP Status=down
+VirtualSwitch[0].Beacon Enabled=false
+VirtualSwitch[0].Beacon Interval=1
+VirtualSwitch[0].Beacon Threshold=3
+VirtualSwitch[0].Portgroups[0]=Lab Isolated
 
 $ orvixcli network vswitch standard set -v vSwitch1 -m 9000 --formatter=json
 true
 
-## Each CDP status word, as list shows it afterwards.
-$ orvixcli network vswitch standard set -v vSwitch0 --cdp-status=down
+## Each CDP status word, as list shows it afterwards (vSwitch1's was down).
+$ orvixcli network vswitch standard set -v vSwitch1 --cdp-status=listen
 
-$ orvixcli network vswitch standard list -v vSwitch0 --formatter=csv
-Name,Class,Num Ports,Used Ports,Configured Ports,MTU,CDP Status,Beacon Enabled,Beacon Interval,Beacon Threshold,Beacon Required By,Uplinks,Portgroups
-vSwitch0,stdswitch,128,7,8,1500,down,false,1,3,Migration,"hwnic0,hwnic1","Management Network,VM Network,Storage,Migration"
+$ orvixcli network vswitch standard list -v vSwitch1 --formatter=keyvalue
+VirtualSwitch[0].Name=vSwitch1
+VirtualSwitch[0].Class=stdswitch
+VirtualSwitch[0].Num Ports=64
+VirtualSwitch[0].Used Ports=0
+VirtualSwitch[0].Configured Ports=1
+VirtualSwitch[0].MTU=9000
+VirtualSwitch[0].CDP Status=listen
+VirtualSwitch[0].Beacon Enabled=false
+VirtualSwitch[0].Beacon Interval=1
+VirtualSwitch[0].Beacon Threshold=3
+VirtualSwitch[0].Portgroups[0]=Lab Isolated
 
-$ orvixcli network vswitch standard set -v vSwitch0 --cdp-status=listen
+$ orvixcli network vswitch standard set -v vSwitch1 --cdp-status=advertise
 
-$ orvixcli network vswitch standard list -v vSwitch0 --formatter=csv
-Name,Class,Num Ports,Used Ports,Configured Ports,MTU,CDP Status,Beacon Enabled,Beacon Interval,Beacon Threshold,Beacon Required By,Uplinks,Portgroups
-vSwitch0,stdswitch,128,7,8,1500,listen,false,1,3,Migration,"hwnic0,hwnic1","Management Network,VM Network,Storage,Migration"
+$ orvixcli network vswitch standard list -v vSwitch1 --formatter=keyvalue
+VirtualSwitch[0].Name=vSwitch1
+VirtualSwitch[0].Class=stdswitch
+VirtualSwitch[0].Num Ports=64
+VirtualSwitch[0].Used Ports=0
+VirtualSwitch[0].Configured Ports=1
+VirtualSwitch[0].MTU=9000
+VirtualSwitch[0].CDP Status=advertise
+VirtualSwitch[0].Beacon Enabled=false
+VirtualSwitch[0].Beacon Interval=1
+VirtualSwitch[0].Beacon Threshold=3
+VirtualSwitch[0].Portgroups[0]=Lab Isolated
 
-$ orvixcli network vswitch standard set -v vSwitch0 --cdp-status=advertise
+$ orvixcli network vswitch standard set -v vSwitch1 -c both
 
-$ orvixcli network vswitch standard list -v vSwitch0 --formatter=csv
-Name,Class,Num Ports,Used Ports,Configured Ports,MTU,CDP Status,Beacon Enabled,Beacon Interval,Beacon Threshold,Beacon Required By,Uplinks,Portgroups
-vSwitch0,stdswitch,128,7,8,1500,advertise,false,1,3,Migration,"hwnic0,hwnic1","Management Network,VM Network,Storage,Migration"
+$ orvixcli network vswitch standard list -v vSwitch1 --formatter=keyvalue
+VirtualSwitch[0].Name=vSwitch1
+VirtualSwitch[0].Class=stdswitch
+VirtualSwitch[0].Num Ports=64
+VirtualSwitch[0].Used Ports=0
+VirtualSwitch[0].Configured Ports=1
+VirtualSwitch[0].MTU=9000
+VirtualSwitch[0].CDP Status=both
+VirtualSwitch[0].Beacon Enabled=false
+VirtualSwitch[0].Beacon Interval=1
+VirtualSwitch[0].Beacon Threshold=3
+VirtualSwitch[0].Portgroups[0]=Lab Isolated
 
-$ orvixcli network vswitch standard set -v vSwitch0 -c both
+$ orvixcli network vswitch standard set -v vSwitch1 --cdp-status=down
 
-$ orvixcli network vswitch standard list -v vSwitch0 --formatter=csv
-Name,Class,Num Ports,Used Ports,Configured Ports,MTU,CDP Status,Beacon Enabled,Beacon Interval,Beacon Threshold,Beacon Required By,Uplinks,Portgroups
-vSwitch0,stdswitch,128,7,8,1500,both,false,1,3,Migration,"hwnic0,hwnic1","Management Network,VM Network,Storage,Migration"
+$ orvixcli network vswitch standard list -v vSwitch1 --formatter=keyvalue
+VirtualSwitch[0].Name=vSwitch1
+VirtualSwitch[0].Class=stdswitch
+VirtualSwitch[0].Num Ports=64
+VirtualSwitch[0].Used Ports=0
+VirtualSwitch[0].Configured Ports=1
+VirtualSwitch[0].MTU=9000
+VirtualSwitch[0].CDP Status=down
+VirtualSwitch[0].Beacon Enabled=false
+VirtualSwitch[0].Beacon Interval=1
+VirtualSwitch[0].Beacon Threshold=3
+VirtualSwitch[0].Portgroups[0]=Lab Isolated
 
-## Both at once.
-$ orvixcli network vswitch standard set -v vSwitch0 -m 9000 -c listen
+## Both at once; a bad MTU stops the command before the CDP status is
+## written.
+$ orvixcli network vswitch standard set -v vSwitch0 -m 9000 -c advertise
 
-$ orvixcli network vswitch standard list -v vSwitch0 --formatter=json
-[
-  {
-    "Name": "vSwitch0",
-    "Class": "stdswitch",
-    "Num Ports": 128,
-    "Used Ports": 7,
-    "Configured Ports": 8,
-    "MTU": 9000,
-    "CDP Status": "listen",
-    "Beacon Enabled": false,
-    "Beacon Interval": 1,
-    "Beacon Threshold": 3,
-    "Beacon Required By": [
-      "Migration"
-    ],
-    "Uplinks": [
-      "hwnic0",
-      "hwnic1"
-    ],
-    "Portgroups": [
-      "Management Network",
-      "VM Network",
-      "Storage",
-      "Migration"
-    ]
-  }
-]
-
-## A bad MTU stops the command before the CDP status is written.
 $ orvixcli network vswitch standard set -v vSwitch0 -m -5 -c down
 ! MTU size should be a positive value
 [1]
 
-$ orvixcli network vswitch standard list -v vSwitch0 --formatter=csv
-Name,Class,Num Ports,Used Ports,Configured Ports,MTU,CDP Status,Beacon Enabled,Beacon Interval,Beacon Threshold,Beacon Required By,Uplinks,Portgroups
-vSwitch0,stdswitch,128,7,8,9000,listen,false,1,3,Migration,"hwnic0,hwnic1","Management Network,VM Network,Storage,Migration"
+$ orvixcli network vswitch standard list -v vSwitch0 --formatter=keyvalue
+VirtualSwitch[0].Name=vSwitch0
+VirtualSwitch[0].Class=stdswitch
+VirtualSwitch[0].Num Ports=128
+VirtualSwitch[0].Used Ports=7
+VirtualSwitch[0].Configured Ports=8
+VirtualSwitch[0].MTU=9000
+VirtualSwitch[0].CDP Status=advertise
+VirtualSwitch[0].Beacon Enabled=false
+VirtualSwitch[0].Beacon Interval=1
+VirtualSwitch[0].Beacon Threshold=3
+VirtualSwitch[0].Beacon Required By[0]=Migration
+VirtualSwitch[0].Uplinks[0]=hwnic0
+VirtualSwitch[0].Uplinks[1]=hwnic1
+VirtualSwitch[0].Portgroups[0]=Management Network
+VirtualSwitch[0].Portgroups[1]=VM Network
+VirtualSwitch[0].Portgroups[2]=Storage
+VirtualSwitch[0].Portgroups[3]=Migration
 
 ## Neither option: nothing changes, and the result is still true.
 $ orvixcli network vswitch standard set -v vSwitch0 --formatter=json

@@ -8,23 +8,15 @@ $ orvixcli network vswitch standard uplink add -v tiny -u hwnic1
 ! Unable to add uplink hwnic1: virtual switch tiny has no free port
 [1]
 
-$ orvixcli network vswitch standard list --formatter=json
-[
-  {
-    "Name": "tiny",
-    "Class": "stdswitch",
-    "Num Ports": 1,
-    "Used Ports": 1,
-    "Configured Ports": 1,
-    "MTU": 1500,
-    "CDP Status": "listen",
-    "Beacon Enabled": false,
-    "Beacon Interval": 1,
-    "Beacon Threshold": 3,
-    "Beacon Required By": [],
-    "Uplinks": [
-      "hwnic0"
-    ],
-    "Portgroups": []
-  }
-]
+$ orvixcli network vswitch standard list -v tiny --formatter=keyvalue
+VirtualSwitch[0].Name=tiny
+VirtualSwitch[0].Class=stdswitch
+VirtualSwitch[0].Num Ports=1
+VirtualSwitch[0].Used Ports=1
+VirtualSwitch[0].Configured Ports=1
+VirtualSwitch[0].MTU=1500
+VirtualSwitch[0].CDP Status=listen
+VirtualSwitch[0].Beacon Enabled=false
+VirtualSwitch[0].Beacon Interval=1
+VirtualSwitch[0].Beacon Threshold=3
+VirtualSwitch[0].Uplinks[0]=hwnic0

@@ -2,22 +2,6 @@
 ## hwnic4 is an uplink of no switch: it can join vSwitch1.
 $ orvixcli network vswitch standard uplink add --vswitch-name=vSwitch1 --uplink-name=hwnic4
 
-$ orvixcli network vswitch standard list -v vSwitch1
-vSwitch1
-   Name: vSwitch1
-   Class: stdswitch
-   Num Ports: 64
-   Used Ports: 1
-   Configured Ports: 2
-   MTU: 9000
-   CDP Status: down
-   Beacon Enabled: false
-   Beacon Interval: 1
-   Beacon Threshold: 3
-   Beacon Required By: 
-   Uplinks: hwnic4
-   Portgroups: Lab Isolated
-
 ## A NIC the host does not have.
 $ orvixcli network vswitch standard uplink add -v vSwitch1 -u hwnic9
 ! Unable to add uplink hwnic9: the host has no physical NIC of that name
@@ -53,9 +37,23 @@ $ orvixcli network vswitch standard uplink add -v dvSwitch0 -u hwnic4
 ## Removing an uplink frees its port; the NIC is no longer listed.
 $ orvixcli network vswitch standard uplink remove --vswitch-name=vSwitch0 --uplink-name=hwnic1
 
-$ orvixcli network vswitch standard list -v vSwitch0 --formatter=csv
-Name,Class,Num Ports,Used Ports,Configured Ports,MTU,CDP Status,Beacon Enabled,Beacon Interval,Beacon Threshold,Beacon Required By,Uplinks,Portgroups
-vSwitch0,stdswitch,128,6,7,1500,listen,false,1,3,Migration,hwnic0,"Management Network,VM Network,Storage,Migration"
+$ orvixcli network vswitch standard list -v vSwitch0 --formatter=keyvalue
+VirtualSwitch[0].Name=vSwitch0
+VirtualSwitch[0].Class=stdswitch
+VirtualSwitch[0].Num Ports=128
+VirtualSwitch[0].Used Ports=6
+VirtualSwitch[0].Configured Ports=7
+VirtualSwitch[0].MTU=1500
+VirtualSwitch[0].CDP Status=listen
+VirtualSwitch[0].Beacon Enabled=false
+VirtualSwitch[0].Beacon Interval=1
+VirtualSwitch[0].Beacon Threshold=3
+VirtualSwitch[0].Beacon Required By[0]=Migration
+VirtualSwitch[0].Uplinks[0]=hwnic0
+VirtualSwitch[0].Portgroups[0]=Management Network
+VirtualSwitch[0].Portgroups[1]=VM Network
+VirtualSwitch[0].Portgroups[2]=Storage
+VirtualSwitch[0].Portgroups[3]=Migration
 
 ## A NIC that is not an uplink of the switch.
 $ orvixcli network vswitch standard uplink remove -v vSwitch0 -u hwnic1
@@ -70,36 +68,37 @@ $ orvixcli network vswitch standard uplink remove -v vSwitch0 -u hwnic4 --format
 $ orvixcli network vswitch standard uplink add -v vSwitch1 -u hwnic1 --formatter=json
 true
 
-$ orvixcli network vswitch standard list -v vSwitch1 --formatter=json
-[
-  {
-    "Name": "vSwitch1",
-    "Class": "stdswitch",
-    "Num Ports": 64,
-    "Used Ports": 2,
-    "Configured Ports": 3,
-    "MTU": 9000,
-    "CDP Status": "down",
-    "Beacon Enabled": false,
-    "Beacon Interval": 1,
-    "Beacon Threshold": 3,
-    "Beacon Required By": [],
-    "Uplinks": [
-      "hwnic4",
-      "hwnic1"
-    ],
-    "Portgroups": [
-      "Lab Isolated"
-    ]
-  }
-]
+$ orvixcli network vswitch standard list -v vSwitch1 --formatter=keyvalue
+VirtualSwitch[0].Name=vSwitch1
+VirtualSwitch[0].Class=stdswitch
+VirtualSwitch[0].Num Ports=64
+VirtualSwitch[0].Used Ports=2
+VirtualSwitch[0].Configured Ports=3
+VirtualSwitch[0].MTU=9000
+VirtualSwitch[0].CDP Status=down
+VirtualSwitch[0].Beacon Enabled=false
+VirtualSwitch[0].Beacon Interval=1
+VirtualSwitch[0].Beacon Threshold=3
+VirtualSwitch[0].Uplinks[0]=hwnic4
+VirtualSwitch[0].Uplinks[1]=hwnic1
+VirtualSwitch[0].Portgroups[0]=Lab Isolated
 
 $ orvixcli network vswitch standard uplink remove -v vSwitch1 -u hwnic4 --formatter=json
 true
 
-$ orvixcli network vswitch standard list -v vSwitch1 --formatter=csv
-Name,Class,Num Ports,Used Ports,Configured Ports,MTU,CDP Status,Beacon Enabled,Beacon Interval,Beacon Threshold,Beacon Required By,Uplinks,Portgroups
-vSwitch1,stdswitch,64,1,2,9000,down,false,1,3,,hwnic1,Lab Isolated
+$ orvixcli network vswitch standard list -v vSwitch1 --formatter=keyvalue
+VirtualSwitch[0].Name=vSwitch1
+VirtualSwitch[0].Class=stdswitch
+VirtualSwitch[0].Num Ports=64
+VirtualSwitch[0].Used Ports=1
+VirtualSwitch[0].Configured Ports=2
+VirtualSwitch[0].MTU=9000
+VirtualSwitch[0].CDP Status=down
+VirtualSwitch[0].Beacon Enabled=false
+VirtualSwitch[0].Beacon Interval=1
+VirtualSwitch[0].Beacon Threshold=3
+VirtualSwitch[0].Uplinks[0]=hwnic1
+VirtualSwitch[0].Portgroups[0]=Lab Isolated
 
 $ orvixcli network vswitch standard uplink add --vswitch-name=vSwitch1
 ! orvixcli: Missing required option --uplink-name
