@@ -79,17 +79,18 @@ void KeepOldStandby(const NicTeamingPolicy& reference, std::vector<std::string>&
 // adapters inside the active part.
 void KeepOldActive(const NicTeamingPolicy& reference, NicTeamingPolicy& policy, std::vector<std::string>& order) {
     std::vector<std::string> kept = reference.GetUplinkOrder();
-    int active = std::min(reference.GetMaxActiveUplinks(), static_cast<int>(kept.size()));
-    for (int i = 0; i < active;) {
+    std::size_t active =
+        std::min(static_cast<std::size_t>(std::max(reference.GetMaxActiveUplinks(), 0)), kept.size());
+    for (std::size_t i = 0; i < active;) {
         if (Contains(order, kept[i])) {
-            kept.erase(kept.begin() + i);
+            kept.erase(kept.begin() + static_cast<std::ptrdiff_t>(i));
             --active;
         } else {
             ++i;
         }
     }
-    policy.SetMaxActiveUplinks(active);
-    kept.resize(static_cast<std::size_t>(active));
+    policy.SetMaxActiveUplinks(static_cast<int>(active));
+    kept.resize(active);
     kept.insert(kept.end(), order.begin(), order.end());
     order = kept;
 }
