@@ -11,6 +11,7 @@
 
 #include "hoststore/HostStore.h"
 
+struct sqlite3;
 struct sqlite3_stmt;
 
 namespace PldCtl {

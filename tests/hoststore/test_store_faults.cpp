@@ -2,7 +2,6 @@
 // being used up, also from another connection.
 #include <gtest/gtest.h>
 
-#include "hostctl/Lib.h"
 #include "support/store_test_util.h"
 
 namespace {
@@ -14,8 +13,8 @@ using PldCtl::Store::HostStore;
 std::string Fired(HostStore& store, const std::string& operation, const std::string& key = "") {
     try {
         store.CheckFault(operation, key);
-    } catch (const HostCtl::Lib::HostCtlException& e) {
-        return e.GetMessage(0);
+    } catch (const PldCtl::Store::InjectedFault& e) {
+        return e.what();
     }
     return "";
 }

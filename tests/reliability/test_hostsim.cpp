@@ -1,7 +1,6 @@
 // orvix-hostsim as a user runs it: exact output, messages and exit statuses.
 #include <gtest/gtest.h>
 
-#include "hostctl/Lib.h"
 #include "reliability_util.h"
 
 namespace {
@@ -94,7 +93,7 @@ TEST_F(HostsimTest, Faults) {
               "2   Vswitch::Add            -       always     no room\n");
     // The faults fire for the library, in another process.
     auto store = HostStore::Open(db);
-    EXPECT_THROW(store->CheckFault("PnicImpl::GetPnicStats", "hwnic2"), HostCtl::Lib::HostCtlException);
+    EXPECT_THROW(store->CheckFault("PnicImpl::GetPnicStats", "hwnic2"), PldCtl::Store::InjectedFault);
     EXPECT_EQ(store->ListFaults().at(0).remaining, 1);
     EXPECT_EQ(Run({"fault", "clear"}).status, 0);
     EXPECT_TRUE(store->ListFaults().empty());

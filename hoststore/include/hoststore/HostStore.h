@@ -8,7 +8,8 @@
 // same data as one JSON document (docs/host-profile.md); dump and load turn
 // one into the other.
 //
-// Only the host-control library and the host simulator tool use this header.
+// Only the host-control library, the host simulator tool and the store's own
+// tests use this header; the library exports none of it.
 #pragma once
 
 #include <cstdint>
@@ -22,7 +23,9 @@
 
 #include <nlohmann/json.hpp>
 
-struct sqlite3;
+// Hidden wherever it is compiled, also in the library's own sources: no
+// shared object exports the store's code, nor code made from its types.
+#pragma GCC visibility push(hidden)
 
 namespace PldCtl {
 namespace Store {
@@ -30,10 +33,17 @@ namespace Store {
 using Json = nlohmann::json;
 
 // The store cannot be used at all: it cannot be created or opened, or the
-// file is damaged, truncated or not a host store. Deliberately not a
-// HostCtlException: commands report those as their own failure, while this
-// one means the host itself is unusable. The message names the file.
+// file is damaged, truncated or not a host store: the host itself is
+// unusable, which the library passes on as it is rather than as a failure of
+// one operation. The message names the file.
 class StoreError : public std::runtime_error {
+public:
+    using std::runtime_error::runtime_error;
+};
+
+// An injected fault fired (see HostStore::CheckFault). what() is the
+// fault's message, which the library reports as the operation's own failure.
+class InjectedFault : public std::runtime_error {
 public:
     using std::runtime_error::runtime_error;
 };
@@ -88,8 +98,8 @@ std::string ReadProfileFile(const std::string& file);
 // order of Singletons() and Collections()).
 std::string FormatProfile(const Json& profile);
 
-// An injected fault: an operation named "Class::Operation" throws
-// HostCtlException with this message; with a key, only for that object.
+// An injected fault: an operation named "Class::Operation" fails with this
+// message; with a key, only for that object.
 // remaining: how many more times it fires; nullopt means every time.
 struct Fault {
     std::int64_t id = 0;
@@ -222,7 +232,7 @@ public:
     Json Dump();
     void Load(const Json& profile);
 
-    // Throws HostCtl::Lib::HostCtlException with the message of the first
+    // Throws InjectedFault with the message of the first
     // fault that matches the operation and key (a fault without key matches
     // every key), using up one firing of a counted fault. A store without
     // faults when first asked is taken to stay without (unless this process
@@ -248,3 +258,5 @@ private:
 
 }  // namespace Store
 }  // namespace PldCtl
+
+#pragma GCC visibility pop

@@ -11,6 +11,7 @@
 #include "vswitch/VswitchRecords.h"
 #include "vswitch/VirtualSwitchPortGroupPolicyShapingSet.h"
 #include "framework/Runner.h"
+#include "hostctl/HostSession.h"
 
 namespace {
 
@@ -42,9 +43,9 @@ NicTeamingPolicy Teaming(const Names& order, int maxActive) {
 class PolicyOptions : public ::testing::Test {
 protected:
     PolicyOptions() : db_("ORVIX_HOST_DB", dir_ / "host.db"), profile_("ORVIX_HOST_PROFILE", std::nullopt) {
-        PldCtl::Store::HostStore::ResetDefault();
+        PldCtl::Lib::ReopenHost();
     }
-    ~PolicyOptions() override { PldCtl::Store::HostStore::ResetDefault(); }
+    ~PolicyOptions() override { PldCtl::Lib::ReopenHost(); }
 
     // Applies failover options to `edited`, with `reference` as the policy
     // shown to the user; returns the errors reported.

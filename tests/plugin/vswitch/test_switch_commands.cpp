@@ -25,8 +25,8 @@
 #include "vswitch/VirtualSwitchStandardSet.h"
 #include "vswitch/VirtualSwitchStandardUplinkAdd.h"
 #include "vswitch/VirtualSwitchStandardUplinkRemove.h"
+#include "hostctl/HostSession.h"
 #include "hostctl/network/NetworkFactory.h"
-#include "hoststore/HostStore.h"
 
 namespace {
 
@@ -67,10 +67,10 @@ protected:
         dir_ = pattern;
         setenv("ORVIX_HOST_DB", (dir_ + "/host.db").c_str(), 1);
         unsetenv("ORVIX_HOST_PROFILE");
-        PldCtl::Store::HostStore::ResetDefault();
+        PldCtl::Lib::ReopenHost();
     }
     ~SwitchCommands() override {
-        PldCtl::Store::HostStore::ResetDefault();
+        PldCtl::Lib::ReopenHost();
         unsetenv("ORVIX_HOST_DB");
         std::error_code ignored;
         std::filesystem::remove_all(dir_, ignored);
