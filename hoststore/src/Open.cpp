@@ -122,10 +122,21 @@ std::string UtcNow() {
     return text;
 }
 
-// Per connection, not stored in the file: every commit reaches the disk
-// before Change() returns.
+// Per connection, not stored in the file, and only for a file that passed
+// Verify (a refused file's side files go as they came):
+// - every commit reaches the disk before Change() returns;
+// - the log and shared-memory files stay when the last connection closes,
+//   so each process does not create and delete them again;
+// - the last connection to close still copies the log into the database
+//   (a checkpoint, as SQLite does on close) and then empties the log file.
+//   Between processes the log is empty and the database file alone holds
+//   the whole store, as Verify's truncation check and a copy of the file
+//   expect; the next process also has no log to replay into its shared
+//   memory, which the first opener always rebuilds.
 void Configure(Sql::Database& db) {
     db.Exec("PRAGMA synchronous = FULL");
+    db.KeepLogFiles();
+    db.Exec("PRAGMA journal_size_limit = 0");
 }
 
 // Brings a store of an older schema up to date. Schema 1 is the first, so

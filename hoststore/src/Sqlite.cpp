@@ -124,6 +124,12 @@ void Database::RollbackQuietly() noexcept {
     if (!sqlite3_get_autocommit(db_)) sqlite3_exec(db_, "ROLLBACK", nullptr, nullptr, nullptr);
 }
 
+void Database::KeepLogFiles() {
+    int keep = 1;
+    const int rc = sqlite3_file_control(db_, "main", SQLITE_FCNTL_PERSIST_WAL, &keep);
+    if (rc != SQLITE_OK) Fail(rc);
+}
+
 std::int64_t Database::Changes() const {
     return sqlite3_changes64(db_);
 }

@@ -85,6 +85,9 @@ public:
     // Ends an open transaction, if any, without throwing: used on paths that
     // are already failing.
     void RollbackQuietly() noexcept;
+    // Keeps the write-ahead log and shared-memory files when the last
+    // connection closes, instead of deleting them.
+    void KeepLogFiles();
     std::int64_t Changes() const;
     std::int64_t LastInsertId() const;
 

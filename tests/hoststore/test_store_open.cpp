@@ -31,6 +31,9 @@ std::vector<std::string> DirectoryEntries(const std::string& directory) {
     return names;
 }
 
+// What a store that was used leaves in its directory.
+const std::vector<std::string> kStoreFiles = {"host.db", "host.db-shm", "host.db-wal"};
+
 TEST(StoreOpenTest, CreateBuildsACompleteStoreInPrivateDirectories) {
     StoreTest::TempDir dir;
     const std::string path = dir / "state/orvix/host.db";
@@ -40,8 +43,10 @@ TEST(StoreOpenTest, CreateBuildsACompleteStoreInPrivateDirectories) {
     ASSERT_EQ(stat((dir / "state").c_str(), &st), 0);
     EXPECT_EQ(st.st_mode & 0777, 0700u);
     store.reset();
-    // Nothing but the store is left: no temporary file, no side file.
-    EXPECT_EQ(DirectoryEntries(dir / "state/orvix"), std::vector<std::string>{"host.db"});
+    // No temporary file is left. The log files stay, and the log is empty:
+    // the database file alone holds the store.
+    EXPECT_EQ(DirectoryEntries(dir / "state/orvix"), kStoreFiles);
+    EXPECT_EQ(std::filesystem::file_size(path + "-wal"), 0u);
     EXPECT_EQ(StoreTest::RawSql(path, "PRAGMA journal_mode"), "wal");
     EXPECT_EQ(StoreTest::RawSql(path, "PRAGMA application_id"), std::to_string(0x4F525658));
     EXPECT_EQ(StoreTest::RawSql(path, "PRAGMA user_version"), "1");
@@ -178,7 +183,7 @@ TEST(StoreOpenTest, RacingCreatorsAllOpenTheWinnersStore) {
         EXPECT_EQ(errors[i], "");
         EXPECT_EQ(hostnames[i], hostnames[0]);
     }
-    EXPECT_EQ(DirectoryEntries(dir / "race"), std::vector<std::string>{"host.db"});
+    EXPECT_EQ(DirectoryEntries(dir / "race"), kStoreFiles);
 }
 
 }  // namespace
