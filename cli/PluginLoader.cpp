@@ -61,7 +61,7 @@ void LoadPlugins(const boost::shared_ptr<AutoCli::Namespace>& root, std::ostream
         for (const auto& file : SharedObjectsIn(dir)) {
             // Plug-ins stay loaded for the life of the process: the tree they
             // build points into their code.
-            void* handle = dlopen(file.c_str(), RTLD_NOW | RTLD_LOCAL);
+            void* handle = dlopen(file.c_str(), RTLD_LAZY | RTLD_LOCAL);
             if (!handle) {
                 err << "orvixcli: cannot load plug-in '" << file << "': " << dlerror() << "\n";
                 continue;
