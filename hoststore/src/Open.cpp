@@ -6,6 +6,7 @@
 #include <sys/stat.h>
 #include <unistd.h>
 
+#include <algorithm>
 #include <cerrno>
 #include <cstring>
 #include <ctime>
@@ -86,6 +87,29 @@ private:
     std::string name_;
 };
 
+// The table of every collection's objects. One table, not one per
+// collection: SQLite parses the whole schema whenever a connection first
+// uses it, and a table with two indexes per collection made that the
+// largest part of every process's work with the store.
+std::string ObjectTableSql() {
+    std::vector<std::string> fields;
+    for (const auto& collection : Collections()) {
+        for (const char* field : collection.columnFields) {
+            if (std::find(fields.begin(), fields.end(), field) == fields.end()) fields.push_back(field);
+        }
+    }
+    std::string columns;
+    for (const auto& field : fields) {
+        columns += ", \"f_" + field + "\" GENERATED ALWAYS AS (json_extract(doc, '$.\"" + field + "\"')) STORED";
+    }
+    return "CREATE TABLE object(section TEXT NOT NULL, key TEXT NOT NULL, parent TEXT, seq INTEGER NOT NULL, "
+           "doc TEXT NOT NULL" +
+           columns +
+           ", PRIMARY KEY (section, key));"
+           "CREATE INDEX object_parent ON object(section, parent, seq);"
+           "CREATE INDEX object_seq ON object(section, seq);";
+}
+
 std::string SchemaSql() {
     std::string sql = "PRAGMA application_id = " + std::to_string(kApplicationId) + ";";
     sql += "PRAGMA user_version = " + std::to_string(kSchemaVersion) + ";";
@@ -93,24 +117,9 @@ std::string SchemaSql() {
     sql += "CREATE TABLE singleton(name TEXT PRIMARY KEY, doc TEXT NOT NULL);";
     sql +=
         "CREATE TABLE fault(id INTEGER PRIMARY KEY AUTOINCREMENT, operation TEXT NOT NULL, key TEXT NOT NULL DEFAULT "
-        "'', "
-        "message TEXT NOT NULL, remaining INTEGER NULL);";
+        "'', message TEXT NOT NULL, remaining INTEGER NULL);";
     sql += "CREATE INDEX fault_operation ON fault(operation);";
-    for (const auto& collection : Collections()) {
-        const std::string table = collection.section;
-        std::string columns;
-        for (const char* field : collection.columnFields) {
-            columns += ", " + ColumnOf(collection, field) + " GENERATED ALWAYS AS (json_extract(doc, '$.\"" +
-                       std::string(field) + "\"')) STORED";
-        }
-        sql += TableSql(table, ("CREATE TABLE %T(key TEXT PRIMARY KEY, parent TEXT, seq INTEGER NOT NULL, "
-                                "doc TEXT NOT NULL" +
-                                columns + ");")
-                                   .c_str());
-        sql += "CREATE INDEX " + Sql::Quote(table + "_parent") + " ON " + Sql::Quote(table) + "(parent, seq);";
-        sql += "CREATE INDEX " + Sql::Quote(table + "_seq") + " ON " + Sql::Quote(table) + "(seq);";
-    }
-    return sql;
+    return sql + ObjectTableSql();
 }
 
 std::string UtcNow() {
@@ -139,15 +148,34 @@ void Configure(Sql::Database& db) {
     db.Exec("PRAGMA journal_size_limit = 0");
 }
 
-// Brings a store of an older schema up to date. Schema 1 is the first, so
-// only a file that never got a schema version can be older; the next schema
-// change adds its upgrade step here.
-void Migrate(const Sql::Database& db, std::int64_t version) {
+// Brings a store of an older schema up to date, in one change; the file
+// passed Verify. Schema 1 kept each collection in a table of its own with
+// the columns the object table has, less the section. A file without a
+// schema version was never a whole store.
+void Migrate(Sql::Database& db, std::int64_t version) {
     if (version < 1) throw StoreError(Sql::Describe(db.Path(), "has no schema version; it is damaged"));
+    db.Exec("BEGIN IMMEDIATE");
+    try {
+        // Another process may have upgraded the file meanwhile.
+        if (db.Integer("PRAGMA user_version") == 1) {
+            std::string sql = ObjectTableSql();
+            for (const auto& collection : Collections()) {
+                const std::string table = Sql::Quote(collection.section);
+                sql += "INSERT INTO object(section, key, parent, seq, doc) SELECT " + Sql::Literal(collection.section) +
+                       ", key, parent, seq, doc FROM " + table + "; DROP TABLE " + table + ";";
+            }
+            db.Exec(sql + "PRAGMA user_version = " + std::to_string(kSchemaVersion));
+        }
+        db.Exec("COMMIT");
+    } catch (...) {
+        db.RollbackQuietly();
+        throw;
+    }
 }
 
-// Everything that can be learnt about the file without writing to it.
-void Verify(Sql::Database& db, off_t size) {
+// Everything that can be learnt about the file without writing to it;
+// returns its schema version.
+std::int64_t Verify(Sql::Database& db, off_t size) {
     const std::string& path = db.Path();
     std::int64_t applicationId = 0;
     try {
@@ -174,7 +202,7 @@ void Verify(Sql::Database& db, off_t size) {
                 path, "is truncated (" + std::to_string(size) + " bytes of " + std::to_string(expected) + ")"));
         }
     }
-    if (version < kSchemaVersion) Migrate(db, version);
+    return version;
 }
 
 }  // namespace
@@ -194,8 +222,9 @@ std::unique_ptr<HostStore> HostStore::Open(const std::string& path) {
     // SQLite takes an empty file for a new database and would write one in it.
     if (st.st_size == 0) throw StoreError(Damaged(path));
     std::unique_ptr<HostStore> store(new HostStore(path));
-    Verify(store->impl_->db, st.st_size);
+    const std::int64_t version = Verify(store->impl_->db, st.st_size);
     Configure(store->impl_->db);
+    if (version < kSchemaVersion) Migrate(store->impl_->db, version);
     return store;
 }
 

@@ -167,13 +167,25 @@ void Database::Fail(int code) const {
     }
 }
 
-std::string Quote(const std::string& identifier) {
-    std::string quoted = "\"";
-    for (char c : identifier) {
+namespace {
+
+std::string Quoted(const std::string& text, char quote) {
+    std::string quoted(1, quote);
+    for (char c : text) {
         quoted += c;
-        if (c == '"') quoted += c;
+        if (c == quote) quoted += c;
     }
-    return quoted + "\"";
+    return quoted + quote;
+}
+
+}  // namespace
+
+std::string Quote(const std::string& identifier) {
+    return Quoted(identifier, '"');
+}
+
+std::string Literal(const std::string& text) {
+    return Quoted(text, '\'');
 }
 
 }  // namespace Sql

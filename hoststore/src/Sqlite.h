@@ -105,6 +105,8 @@ private:
 
 // An SQL identifier in double quotes, for table and index names.
 std::string Quote(const std::string& identifier);
+// A string as an SQL literal, in single quotes.
+std::string Literal(const std::string& text);
 
 }  // namespace Sql
 }  // namespace Store

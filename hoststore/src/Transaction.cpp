@@ -139,7 +139,7 @@ std::vector<Json> Transaction::ListByParentOrder(const std::string& section) {
         throw std::invalid_argument(section + ": its objects have no parent section to be ordered by");
     }
     auto& db = store_.impl_->db;
-    const std::string sql = "SELECT c.doc FROM %T AS c JOIN " + Sql::Quote(collection.parentSection) +
+    const std::string sql = "SELECT c.doc FROM %T AS c JOIN " + TableSql(collection.parentSection, "%T") +
                             " AS p ON p.key = c.parent ORDER BY p.seq, c.seq";
     auto query = db.Prepare(TableSql(section, sql.c_str()));
     return Documents(db, query);
@@ -173,22 +173,23 @@ void Transaction::Put(const std::string& section, const Json& object) {
         collection.keyFields.empty()
             ? "#" + std::to_string(db.Integer(TableSql(section, "SELECT coalesce(max(seq), 0) + 1 FROM %T")))
             : KeyOf(collection, object);
-    auto query = db.Prepare(TableSql(section,
-                                     "INSERT INTO %T(key, parent, seq, doc) "
-                                     "VALUES (?1, ?2, (SELECT coalesce(max(seq), 0) + 1 FROM %T), ?3) "
-                                     "ON CONFLICT(key) DO UPDATE SET parent = excluded.parent, doc = excluded.doc"));
+    auto query =
+        db.Prepare(TableSql(section,
+                            "INSERT INTO object(section, key, parent, seq, doc) "
+                            "VALUES (%S, ?1, ?2, (SELECT coalesce(max(seq), 0) + 1 FROM %T), ?3) "
+                            "ON CONFLICT(section, key) DO UPDATE SET parent = excluded.parent, doc = excluded.doc"));
     query.Bind(1, key).Bind(2, parent).Bind(3, object.dump()).Run();
 }
 
 bool Transaction::Remove(const std::string& section, const std::string& key) {
     auto& db = store_.impl_->Writable();
-    Statement(db, section, "DELETE FROM %T WHERE key = ?1").Bind(1, key).Run();
+    Statement(db, section, "DELETE FROM object WHERE section = %S AND key = ?1").Bind(1, key).Run();
     return db.Changes() > 0;
 }
 
 std::int64_t Transaction::RemoveChildren(const std::string& section, const std::string& parent) {
     auto& db = store_.impl_->Writable();
-    Statement(db, section, "DELETE FROM %T WHERE parent = ?1").Bind(1, parent).Run();
+    Statement(db, section, "DELETE FROM object WHERE section = %S AND parent = ?1").Bind(1, parent).Run();
     return db.Changes();
 }
 

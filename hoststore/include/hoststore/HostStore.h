@@ -2,9 +2,10 @@
 //
 // The host is a set of collections of JSON objects (NICs, switches, port
 // groups, ...) plus a few singleton objects ("system", "firewall"). Each
-// collection is a table of (key, parent, seq, doc): the object's key is made
-// from its key fields, its parent from its parent field, seq keeps the
-// library's order, and doc is the object itself as JSON. A host profile is the
+// object is a row (section, key, parent, seq, doc) of one table: section
+// names its collection, the object's key is made from its key fields, its
+// parent from its parent field, seq keeps the library's order within the
+// collection, and doc is the object itself as JSON. A host profile is the
 // same data as one JSON document (docs/host-profile.md); dump and load turn
 // one into the other.
 //
@@ -80,7 +81,7 @@ const std::vector<std::string>& Singletons();
 constexpr const char* kProfileFormat = "orvix-host-profile";
 constexpr int kProfileVersion = 1;
 // The schema version of the database file (PRAGMA user_version).
-constexpr int kSchemaVersion = 1;
+constexpr int kSchemaVersion = 2;
 
 // The embedded default host.
 const std::string& DefaultProfileText();
@@ -139,8 +140,7 @@ public:
     std::int64_t MaxIntegerKey(const std::string& section);
     // The objects that pass every test, counted per parent (or per value of
     // `field`), in one pass over the collection; groups with none are absent.
-    std::map<std::string, std::int64_t> CountByParent(const std::string& section,
-                                                      const std::vector<FieldTest>& tests);
+    std::map<std::string, std::int64_t> CountByParent(const std::string& section, const std::vector<FieldTest>& tests);
     std::map<std::string, std::int64_t> CountByField(const std::string& section, const std::string& field,
                                                      const std::vector<FieldTest>& tests);
     // Every object of a collection with a parent section, ordered by its
