@@ -100,8 +100,6 @@ TEST_F(HostsimTest, Faults) {
 
     EXPECT_EQ(Failure({"fault", "add", "GetPnicStats", "--message", "m"}, 2),
               "orvix-hostsim: fault operation 'GetPnicStats' must look like Class::Operation\n");
-    EXPECT_EQ(Failure({"fault", "add", "A::B", "--message", "m", "--count", "0"}, 2),
-              "orvix-hostsim: a fault's count must be at least 1, not 0\n");
     EXPECT_EQ(Failure({"fault", "add", "A::B", "--message", "m", "--count", "2x"}, 2),
               "orvix-hostsim: --count: '2x' is not an integer\n");
     EXPECT_EQ(Failure({"fault", "add", "A::B"}, 2), "orvix-hostsim: fault add: --message is required\n");
@@ -112,7 +110,6 @@ TEST_F(HostsimTest, UsageErrorsAndHelp) {
     EXPECT_EQ(Failure({}, 2), "orvix-hostsim: missing command (see orvix-hostsim --help)\n");
     EXPECT_EQ(Failure({"dumb"}, 2), "orvix-hostsim: unknown command 'dumb' (see orvix-hostsim --help)\n");
     EXPECT_EQ(Failure({"fault"}, 2), "orvix-hostsim: fault: expected one of add, list, clear\n");
-    EXPECT_EQ(Failure({"fault", "remove"}, 2), "orvix-hostsim: fault: expected one of add, list, clear\n");
     EXPECT_EQ(Failure({"load"}, 2), "orvix-hostsim: load: missing FILE\n");
     EXPECT_EQ(Failure({"dump", "extra"}, 2), "orvix-hostsim: dump: unexpected argument 'extra'\n");
     EXPECT_EQ(Failure({"dump", "--all"}, 2), "orvix-hostsim: dump: unknown option '--all'\n");
@@ -124,12 +121,6 @@ TEST_F(HostsimTest, UsageErrorsAndHelp) {
     // Nothing was created by any of them.
     EXPECT_FALSE(std::filesystem::exists(db));
 
-    const Result help = RunBare({"--help"});
-    EXPECT_EQ(help.status, 0);
-    for (const char* command :
-         {"init", "dump", "load FILE", "fault add OPERATION", "fault list", "fault clear", "path"}) {
-        EXPECT_NE(help.out.find("\n  " + std::string(command) + " "), std::string::npos) << command;
-    }
     const Result addHelp = Run({"fault", "add", "--help"});
     EXPECT_EQ(addHelp.status, 0);
     EXPECT_EQ(addHelp.out.rfind(
@@ -141,10 +132,6 @@ TEST_F(HostsimTest, PathFollowsOptionAndEnvironment) {
     StoreTest::ScopedEnv env("ORVIX_HOST_DB", dir / "env.db");
     EXPECT_EQ(RunBare({"path"}).out, (dir / "env.db") + "\n");
     EXPECT_EQ(Run({"path"}).out, db + "\n");
-    // The first use creates the host from ORVIX_HOST_PROFILE.
-    StoreTest::ScopedEnv profile("ORVIX_HOST_PROFILE", fixture);
-    EXPECT_EQ(RunBare({"dump"}).out, fixtureDump);
-    EXPECT_TRUE(std::filesystem::exists(dir / "env.db"));
 }
 
 }  // namespace
