@@ -92,15 +92,16 @@ private:
 // uses it, and a table with two indexes per collection made that the
 // largest part of every process's work with the store.
 std::string ObjectTableSql() {
-    std::vector<std::string> fields;
+    // A field kept in a column by several collections has one column.
+    std::vector<std::string> names;
+    std::string columns;
     for (const auto& collection : Collections()) {
         for (const char* field : collection.columnFields) {
-            if (std::find(fields.begin(), fields.end(), field) == fields.end()) fields.push_back(field);
+            const std::string name = ColumnOf(collection, field);
+            if (std::find(names.begin(), names.end(), name) != names.end()) continue;
+            names.push_back(name);
+            columns += ", " + name + " GENERATED ALWAYS AS (json_extract(doc, '$.\"" + field + "\"')) STORED";
         }
-    }
-    std::string columns;
-    for (const auto& field : fields) {
-        columns += ", \"f_" + field + "\" GENERATED ALWAYS AS (json_extract(doc, '$.\"" + field + "\"')) STORED";
     }
     return "CREATE TABLE object(section TEXT NOT NULL, key TEXT NOT NULL, parent TEXT, seq INTEGER NOT NULL, "
            "doc TEXT NOT NULL" +

@@ -49,9 +49,9 @@ bool PathExists(const std::string& path);
 // A stored object; a document that is not JSON means a damaged store.
 Json ParseDoc(const Sql::Database& db, const std::string& text);
 
-// SQL text about one collection: every "%T" becomes the collection's rows,
-// usable wherever a table is read (FROM, JOIN), and every "%S" its section
-// as a literal, for statements that write the object table.
+// SQL text about one collection: every "%S" becomes its section as an SQL
+// literal (for "... FROM object WHERE section = %S ..."), and every "%T" the
+// collection's rows, usable wherever a table is read (FROM, JOIN).
 std::string TableSql(const std::string& section, const char* format);
 
 }  // namespace Store
