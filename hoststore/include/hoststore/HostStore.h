@@ -232,12 +232,12 @@ public:
     Json Dump();
     void Load(const Json& profile);
 
-    // Throws InjectedFault with the message of the first
-    // fault that matches the operation and key (a fault without key matches
-    // every key), using up one firing of a counted fault. A store without
-    // faults when first asked is taken to stay without (unless this process
-    // adds one), so the check costs nothing on a host nobody tests; a fault
-    // armed by another process meanwhile is seen by processes started later.
+    // Throws InjectedFault with the message of the first fault that matches
+    // the operation and key (a fault without key matches every key), using
+    // up one firing of a counted fault. A store without faults when first
+    // asked is taken to stay without (unless this process adds one), so the
+    // check costs nothing on a host nobody tests; a fault armed by another
+    // process meanwhile is seen by processes started later.
     void CheckFault(const std::string& operation, const std::string& key = std::string());
     std::vector<Fault> ListFaults();
     std::int64_t AddFault(const Fault& fault);
