@@ -17,7 +17,8 @@ trap 'rm -rf "$work"' EXIT
 unset ORVIX_HOST_PROFILE
 
 cli="$bin/orvixcli"
-# The switch a run adds and removes again, so every round finds the same host.
+# The switch a run adds and removes again, and the IPv6 setting it turns off
+# and on again, so every round finds the same host and every change writes.
 scratch="--vswitch-name=benchSwitch"
 
 export ORVIX_HOST_DB=$work/default.db
@@ -26,6 +27,7 @@ echo "Default host ($runs runs each, $(nproc) cores):"
 "$bin/orvix-bench-timer" "$runs" \
     "baseline (dlopen + one call)" "$bin/orvix-bench-baseline" \
     "network ip get" "$cli network ip get" \
+    "network ip set --ipv6-enabled=false" "$cli network ip set --ipv6-enabled=false" \
     "network ip set --ipv6-enabled=true" "$cli network ip set --ipv6-enabled=true" \
     "--help" "$cli --help" \
     "network vswitch standard list" "$cli network vswitch standard list" \

@@ -60,8 +60,11 @@ void LoadPlugins(const boost::shared_ptr<AutoCli::Namespace>& root, std::ostream
     for (const auto& dir : PluginDirectories()) {
         for (const auto& file : SharedObjectsIn(dir)) {
             // Plug-ins stay loaded for the life of the process: the tree they
-            // build points into their code.
-            void* handle = dlopen(file.c_str(), RTLD_NOW | RTLD_LOCAL);
+            // build points into their code. Their functions are bound when
+            // first called: one command calls few of those its plug-in and
+            // the plug-in's libraries could, and binding them all up front
+            // was a noticeable part of every command's start.
+            void* handle = dlopen(file.c_str(), RTLD_LAZY | RTLD_LOCAL);
             if (!handle) {
                 err << "orvixcli: cannot load plug-in '" << file << "': " << dlerror() << "\n";
                 continue;

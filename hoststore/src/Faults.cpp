@@ -3,7 +3,6 @@
 #include <cctype>
 
 #include "StoreImpl.h"
-#include "hostctl/Lib.h"
 
 namespace PldCtl {
 namespace Store {
@@ -61,7 +60,7 @@ void HostStore::CheckFault(const std::string& operation, const std::string& key)
         });
         if (!fired) return;
     }
-    throw HostCtl::Lib::HostCtlException(message);
+    throw InjectedFault(message);
 }
 
 std::vector<Fault> HostStore::ListFaults() {

@@ -32,11 +32,21 @@ std::chrono::microseconds Jitter(std::chrono::microseconds upTo) {
 
 }  // namespace
 
-std::string TableSql(const std::string& table, const char* format) {
+std::string TableSql(const std::string& section, const char* format) {
+    const std::string literal = Sql::Literal(section);
+    // SQLite flattens the subquery into the statement, so a read of one
+    // collection uses the object table's indexes as if it were a table.
+    const std::string rows = "(SELECT * FROM object WHERE section = " + literal + ")";
     std::string sql = format;
-    const std::string quoted = Sql::Quote(table);
-    for (auto at = sql.find("%T"); at != std::string::npos; at = sql.find("%T", at + quoted.size())) {
-        sql.replace(at, 2, quoted);
+    for (auto at = sql.find('%'); at != std::string::npos && at + 1 < sql.size(); at = sql.find('%', at)) {
+        const char what = sql[at + 1];
+        if (what != 'T' && what != 'S') {
+            ++at;
+            continue;
+        }
+        const std::string& replacement = what == 'T' ? rows : literal;
+        sql.replace(at, 2, replacement);
+        at += replacement.size();
     }
     return sql;
 }
@@ -149,8 +159,8 @@ void HostStore::Load(const Json& profile) {
         for (const auto& name : Singletons()) {
             if (profile.contains(name)) transaction.PutSingleton(name, profile.at(name));
         }
+        impl_->db.Exec("DELETE FROM object");
         for (const auto& collection : Collections()) {
-            impl_->db.Exec(TableSql(collection.section, "DELETE FROM %T"));
             if (!profile.contains(collection.section)) continue;
             for (const auto& object : profile.at(collection.section)) transaction.Put(collection.section, object);
         }

@@ -6,6 +6,7 @@
 #include <sys/stat.h>
 #include <unistd.h>
 
+#include <algorithm>
 #include <cerrno>
 #include <cstring>
 #include <ctime>
@@ -86,6 +87,30 @@ private:
     std::string name_;
 };
 
+// The table of every collection's objects. One table, not one per
+// collection: SQLite parses the whole schema whenever a connection first
+// uses it, and a table with two indexes per collection made that the
+// largest part of every process's work with the store.
+std::string ObjectTableSql() {
+    // A field kept in a column by several collections has one column.
+    std::vector<std::string> names;
+    std::string columns;
+    for (const auto& collection : Collections()) {
+        for (const char* field : collection.columnFields) {
+            const std::string name = ColumnOf(collection, field);
+            if (std::find(names.begin(), names.end(), name) != names.end()) continue;
+            names.push_back(name);
+            columns += ", " + name + " GENERATED ALWAYS AS (json_extract(doc, '$.\"" + field + "\"')) STORED";
+        }
+    }
+    return "CREATE TABLE object(section TEXT NOT NULL, key TEXT NOT NULL, parent TEXT, seq INTEGER NOT NULL, "
+           "doc TEXT NOT NULL" +
+           columns +
+           ", PRIMARY KEY (section, key));"
+           "CREATE INDEX object_parent ON object(section, parent, seq);"
+           "CREATE INDEX object_seq ON object(section, seq);";
+}
+
 std::string SchemaSql() {
     std::string sql = "PRAGMA application_id = " + std::to_string(kApplicationId) + ";";
     sql += "PRAGMA user_version = " + std::to_string(kSchemaVersion) + ";";
@@ -93,24 +118,9 @@ std::string SchemaSql() {
     sql += "CREATE TABLE singleton(name TEXT PRIMARY KEY, doc TEXT NOT NULL);";
     sql +=
         "CREATE TABLE fault(id INTEGER PRIMARY KEY AUTOINCREMENT, operation TEXT NOT NULL, key TEXT NOT NULL DEFAULT "
-        "'', "
-        "message TEXT NOT NULL, remaining INTEGER NULL);";
+        "'', message TEXT NOT NULL, remaining INTEGER NULL);";
     sql += "CREATE INDEX fault_operation ON fault(operation);";
-    for (const auto& collection : Collections()) {
-        const std::string table = collection.section;
-        std::string columns;
-        for (const char* field : collection.columnFields) {
-            columns += ", " + ColumnOf(collection, field) + " GENERATED ALWAYS AS (json_extract(doc, '$.\"" +
-                       std::string(field) + "\"')) STORED";
-        }
-        sql += TableSql(table, ("CREATE TABLE %T(key TEXT PRIMARY KEY, parent TEXT, seq INTEGER NOT NULL, "
-                                "doc TEXT NOT NULL" +
-                                columns + ");")
-                                   .c_str());
-        sql += "CREATE INDEX " + Sql::Quote(table + "_parent") + " ON " + Sql::Quote(table) + "(parent, seq);";
-        sql += "CREATE INDEX " + Sql::Quote(table + "_seq") + " ON " + Sql::Quote(table) + "(seq);";
-    }
-    return sql;
+    return sql + ObjectTableSql();
 }
 
 std::string UtcNow() {
@@ -122,21 +132,51 @@ std::string UtcNow() {
     return text;
 }
 
-// Per connection, not stored in the file: every commit reaches the disk
-// before Change() returns.
+// Per connection, not stored in the file, and only for a file that passed
+// Verify (a refused file's side files go as they came):
+// - every commit reaches the disk before Change() returns;
+// - the log and shared-memory files stay when the last connection closes,
+//   so each process does not create and delete them again;
+// - the last connection to close still copies the log into the database
+//   (a checkpoint, as SQLite does on close) and then empties the log file.
+//   Between processes the log is empty and the database file alone holds
+//   the whole store, as Verify's truncation check and a copy of the file
+//   expect; the next process also has no log to replay into its shared
+//   memory, which the first opener always rebuilds.
 void Configure(Sql::Database& db) {
     db.Exec("PRAGMA synchronous = FULL");
+    db.KeepLogFiles();
+    db.Exec("PRAGMA journal_size_limit = 0");
 }
 
-// Brings a store of an older schema up to date. Schema 1 is the first, so
-// only a file that never got a schema version can be older; the next schema
-// change adds its upgrade step here.
-void Migrate(const Sql::Database& db, std::int64_t version) {
+// Brings a store of an older schema up to date, in one change; the file
+// passed Verify. Schema 1 kept each collection in a table of its own with
+// the columns the object table has, less the section. A file without a
+// schema version was never a whole store.
+void Migrate(Sql::Database& db, std::int64_t version) {
     if (version < 1) throw StoreError(Sql::Describe(db.Path(), "has no schema version; it is damaged"));
+    db.Exec("BEGIN IMMEDIATE");
+    try {
+        // Another process may have upgraded the file meanwhile.
+        if (db.Integer("PRAGMA user_version") == 1) {
+            std::string sql = ObjectTableSql();
+            for (const auto& collection : Collections()) {
+                const std::string table = Sql::Quote(collection.section);
+                sql += "INSERT INTO object(section, key, parent, seq, doc) SELECT " + Sql::Literal(collection.section) +
+                       ", key, parent, seq, doc FROM " + table + "; DROP TABLE " + table + ";";
+            }
+            db.Exec(sql + "PRAGMA user_version = " + std::to_string(kSchemaVersion));
+        }
+        db.Exec("COMMIT");
+    } catch (...) {
+        db.RollbackQuietly();
+        throw;
+    }
 }
 
-// Everything that can be learnt about the file without writing to it.
-void Verify(Sql::Database& db, off_t size) {
+// Everything that can be learnt about the file without writing to it;
+// returns its schema version.
+std::int64_t Verify(Sql::Database& db, off_t size) {
     const std::string& path = db.Path();
     std::int64_t applicationId = 0;
     try {
@@ -163,7 +203,7 @@ void Verify(Sql::Database& db, off_t size) {
                 path, "is truncated (" + std::to_string(size) + " bytes of " + std::to_string(expected) + ")"));
         }
     }
-    if (version < kSchemaVersion) Migrate(db, version);
+    return version;
 }
 
 }  // namespace
@@ -183,8 +223,9 @@ std::unique_ptr<HostStore> HostStore::Open(const std::string& path) {
     // SQLite takes an empty file for a new database and would write one in it.
     if (st.st_size == 0) throw StoreError(Damaged(path));
     std::unique_ptr<HostStore> store(new HostStore(path));
-    Verify(store->impl_->db, st.st_size);
+    const std::int64_t version = Verify(store->impl_->db, st.st_size);
     Configure(store->impl_->db);
+    if (version < kSchemaVersion) Migrate(store->impl_->db, version);
     return store;
 }
 

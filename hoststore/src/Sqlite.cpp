@@ -13,6 +13,21 @@ namespace {
 // covers the rare cases where SQLite reports busy without waiting.
 constexpr int kBusyTimeoutMs = 10000;
 
+// SQLite's process-wide settings, made before its first use. SQLite is the
+// store's own copy, so nothing else in the process depends on them. The
+// store gives each connection to one thread at a time, so SQLite needs no
+// mutex per connection, and nobody reads its memory statistics.
+void InitialiseSqlite() {
+    static const int initialised = [] {
+        sqlite3_config(SQLITE_CONFIG_MULTITHREAD);
+        sqlite3_config(SQLITE_CONFIG_MEMSTATUS, 0);
+        return sqlite3_initialize();
+    }();
+    if (initialised != SQLITE_OK) {
+        throw StoreError("SQLite cannot be initialised: " + std::string(sqlite3_errstr(initialised)));
+    }
+}
+
 }  // namespace
 
 std::string Describe(const std::string& path, const std::string& problem) {
@@ -80,6 +95,7 @@ void Database::Finalizer::operator()(sqlite3_stmt* stmt) const {
 }
 
 Database::Database(const std::string& path) : path_(path) {
+    InitialiseSqlite();
     int rc = sqlite3_open_v2(path.c_str(), &db_, SQLITE_OPEN_READWRITE, nullptr);
     if (rc != SQLITE_OK) {
         std::string message = db_ ? sqlite3_errmsg(db_) : sqlite3_errstr(rc);
@@ -124,6 +140,12 @@ void Database::RollbackQuietly() noexcept {
     if (!sqlite3_get_autocommit(db_)) sqlite3_exec(db_, "ROLLBACK", nullptr, nullptr, nullptr);
 }
 
+void Database::KeepLogFiles() {
+    int keep = 1;
+    const int rc = sqlite3_file_control(db_, "main", SQLITE_FCNTL_PERSIST_WAL, &keep);
+    if (rc != SQLITE_OK) Fail(rc);
+}
+
 std::int64_t Database::Changes() const {
     return sqlite3_changes64(db_);
 }
@@ -145,13 +167,25 @@ void Database::Fail(int code) const {
     }
 }
 
-std::string Quote(const std::string& identifier) {
-    std::string quoted = "\"";
-    for (char c : identifier) {
+namespace {
+
+std::string Quoted(const std::string& text, char quote) {
+    std::string quoted(1, quote);
+    for (char c : text) {
         quoted += c;
-        if (c == '"') quoted += c;
+        if (c == quote) quoted += c;
     }
-    return quoted + "\"";
+    return quoted + quote;
+}
+
+}  // namespace
+
+std::string Quote(const std::string& identifier) {
+    return Quoted(identifier, '"');
+}
+
+std::string Literal(const std::string& text) {
+    return Quoted(text, '\'');
 }
 
 }  // namespace Sql

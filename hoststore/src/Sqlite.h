@@ -11,6 +11,7 @@
 
 #include "hoststore/HostStore.h"
 
+struct sqlite3;
 struct sqlite3_stmt;
 
 namespace PldCtl {
@@ -84,6 +85,9 @@ public:
     // Ends an open transaction, if any, without throwing: used on paths that
     // are already failing.
     void RollbackQuietly() noexcept;
+    // Keeps the write-ahead log and shared-memory files when the last
+    // connection closes, instead of deleting them.
+    void KeepLogFiles();
     std::int64_t Changes() const;
     std::int64_t LastInsertId() const;
 
@@ -101,6 +105,8 @@ private:
 
 // An SQL identifier in double quotes, for table and index names.
 std::string Quote(const std::string& identifier);
+// A string as an SQL literal, in single quotes.
+std::string Literal(const std::string& text);
 
 }  // namespace Sql
 }  // namespace Store

@@ -49,8 +49,10 @@ bool PathExists(const std::string& path);
 // A stored object; a document that is not JSON means a damaged store.
 Json ParseDoc(const Sql::Database& db, const std::string& text);
 
-// SQL text with every "%T" replaced by the quoted table name.
-std::string TableSql(const std::string& table, const char* format);
+// SQL text about one collection: every "%S" becomes its section as an SQL
+// literal (for "... FROM object WHERE section = %S ..."), and every "%T" the
+// collection's rows, usable wherever a table is read (FROM, JOIN).
+std::string TableSql(const std::string& section, const char* format);
 
 }  // namespace Store
 }  // namespace PldCtl

@@ -1,7 +1,8 @@
 // Reads and writes of single objects. Every query is a cached statement on
-// an index: by key (the primary key), by parent (parent, seq) or in order
-// (seq), so a host with thousands of objects costs no more per call than a
-// small one, and only the objects asked for are parsed.
+// an index of the object table: by key (section, key), by parent (section,
+// parent, seq) or in order (section, seq), so a host with thousands of
+// objects costs no more per call than a small one, and only the objects
+// asked for are parsed.
 #include "StoreImpl.h"
 
 namespace PldCtl {
@@ -30,38 +31,38 @@ void RequireSingleton(const std::string& name) {
 
 std::optional<Json> Transaction::Get(const std::string& section, const std::string& key) {
     auto& db = store_.impl_->db;
-    auto query = Statement(db, section, "SELECT doc FROM %T WHERE key = ?1");
+    auto query = Statement(db, section, "SELECT doc FROM object WHERE section = %S AND key = ?1");
     query.Bind(1, key);
     if (!query.Next()) return std::nullopt;
     return ParseDoc(db, query.Text(0));
 }
 
 bool Transaction::Exists(const std::string& section, const std::string& key) {
-    auto query = Statement(store_.impl_->db, section, "SELECT 1 FROM %T WHERE key = ?1");
+    auto query = Statement(store_.impl_->db, section, "SELECT 1 FROM object WHERE section = %S AND key = ?1");
     return query.Bind(1, key).Next();
 }
 
 std::vector<Json> Transaction::List(const std::string& section) {
     auto& db = store_.impl_->db;
-    auto query = Statement(db, section, "SELECT doc FROM %T ORDER BY seq");
+    auto query = Statement(db, section, "SELECT doc FROM object WHERE section = %S ORDER BY seq");
     return Documents(db, query);
 }
 
 std::vector<Json> Transaction::ListChildren(const std::string& section, const std::string& parent) {
     auto& db = store_.impl_->db;
-    auto query = Statement(db, section, "SELECT doc FROM %T WHERE parent = ?1 ORDER BY seq");
+    auto query = Statement(db, section, "SELECT doc FROM object WHERE section = %S AND parent = ?1 ORDER BY seq");
     query.Bind(1, parent);
     return Documents(db, query);
 }
 
 std::int64_t Transaction::Count(const std::string& section) {
-    auto query = Statement(store_.impl_->db, section, "SELECT count(*) FROM %T");
+    auto query = Statement(store_.impl_->db, section, "SELECT count(*) FROM object WHERE section = %S");
     query.Next();
     return query.Int(0);
 }
 
 std::int64_t Transaction::CountChildren(const std::string& section, const std::string& parent) {
-    auto query = Statement(store_.impl_->db, section, "SELECT count(*) FROM %T WHERE parent = ?1");
+    auto query = Statement(store_.impl_->db, section, "SELECT count(*) FROM object WHERE section = %S AND parent = ?1");
     query.Bind(1, parent).Next();
     return query.Int(0);
 }
@@ -92,8 +93,8 @@ std::string Transaction::Conditions(const CollectionInfo& collection, const std:
 std::int64_t Transaction::CountChildren(const std::string& section, const std::string& parent,
                                         const std::vector<FieldTest>& tests) {
     std::vector<std::string> bindings;
-    const std::string sql =
-        "SELECT count(*) FROM %T WHERE parent = ?1" + Conditions(Collection(section), tests, true, bindings);
+    const std::string sql = "SELECT count(*) FROM object WHERE section = %S AND parent = ?1" +
+                            Conditions(Collection(section), tests, true, bindings);
     auto query = Statement(store_.impl_->db, section, sql.c_str());
     query.Bind(1, parent);
     for (std::size_t i = 0; i < bindings.size(); ++i) query.Bind(static_cast<int>(i + 2), bindings[i]);
@@ -139,8 +140,9 @@ std::vector<Json> Transaction::ListByParentOrder(const std::string& section) {
         throw std::invalid_argument(section + ": its objects have no parent section to be ordered by");
     }
     auto& db = store_.impl_->db;
-    const std::string sql = "SELECT c.doc FROM %T AS c JOIN " + Sql::Quote(collection.parentSection) +
-                            " AS p ON p.key = c.parent ORDER BY p.seq, c.seq";
+    const std::string sql =
+        "SELECT c.doc FROM object AS c JOIN object AS p ON p.section = " + Sql::Literal(collection.parentSection) +
+        " AND p.key = c.parent WHERE c.section = %S ORDER BY p.seq, c.seq";
     auto query = db.Prepare(TableSql(section, sql.c_str()));
     return Documents(db, query);
 }
@@ -149,7 +151,8 @@ std::int64_t Transaction::SumField(const std::string& section, const std::string
     std::string value = ColumnOf(Collection(section), field);
     if (value.empty()) value = "json_extract(doc, ?2)";
     auto query =
-        Statement(store_.impl_->db, section, ("SELECT coalesce(sum(coalesce(" + value + ", ?1)), 0) FROM %T").c_str());
+        Statement(store_.impl_->db, section,
+                  ("SELECT coalesce(sum(coalesce(" + value + ", ?1)), 0) FROM object WHERE section = %S").c_str());
     query.Bind(1, fallback);
     if (value[0] != '"') query.Bind(2, "$.\"" + field + "\"");
     query.Next();
@@ -157,7 +160,8 @@ std::int64_t Transaction::SumField(const std::string& section, const std::string
 }
 
 std::int64_t Transaction::MaxIntegerKey(const std::string& section) {
-    auto query = Statement(store_.impl_->db, section, "SELECT coalesce(max(CAST(key AS INTEGER)), 0) FROM %T");
+    auto query = Statement(store_.impl_->db, section,
+                           "SELECT coalesce(max(CAST(key AS INTEGER)), 0) FROM object WHERE section = %S");
     query.Next();
     return query.Int(0);
 }
@@ -171,24 +175,26 @@ void Transaction::Put(const std::string& section, const Json& object) {
     // place it gets, which the insert below computes the same way.
     const std::string key =
         collection.keyFields.empty()
-            ? "#" + std::to_string(db.Integer(TableSql(section, "SELECT coalesce(max(seq), 0) + 1 FROM %T")))
+            ? "#" + std::to_string(db.Integer(
+                        TableSql(section, "SELECT coalesce(max(seq), 0) + 1 FROM object WHERE section = %S")))
             : KeyOf(collection, object);
-    auto query = db.Prepare(TableSql(section,
-                                     "INSERT INTO %T(key, parent, seq, doc) "
-                                     "VALUES (?1, ?2, (SELECT coalesce(max(seq), 0) + 1 FROM %T), ?3) "
-                                     "ON CONFLICT(key) DO UPDATE SET parent = excluded.parent, doc = excluded.doc"));
+    auto query = db.Prepare(
+        TableSql(section,
+                 "INSERT INTO object(section, key, parent, seq, doc) "
+                 "VALUES (%S, ?1, ?2, (SELECT coalesce(max(seq), 0) + 1 FROM object WHERE section = %S), ?3) "
+                 "ON CONFLICT(section, key) DO UPDATE SET parent = excluded.parent, doc = excluded.doc"));
     query.Bind(1, key).Bind(2, parent).Bind(3, object.dump()).Run();
 }
 
 bool Transaction::Remove(const std::string& section, const std::string& key) {
     auto& db = store_.impl_->Writable();
-    Statement(db, section, "DELETE FROM %T WHERE key = ?1").Bind(1, key).Run();
+    Statement(db, section, "DELETE FROM object WHERE section = %S AND key = ?1").Bind(1, key).Run();
     return db.Changes() > 0;
 }
 
 std::int64_t Transaction::RemoveChildren(const std::string& section, const std::string& parent) {
     auto& db = store_.impl_->Writable();
-    Statement(db, section, "DELETE FROM %T WHERE parent = ?1").Bind(1, parent).Run();
+    Statement(db, section, "DELETE FROM object WHERE section = %S AND parent = ?1").Bind(1, parent).Run();
     return db.Changes();
 }
 

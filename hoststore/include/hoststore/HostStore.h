@@ -2,13 +2,15 @@
 //
 // The host is a set of collections of JSON objects (NICs, switches, port
 // groups, ...) plus a few singleton objects ("system", "firewall"). Each
-// collection is a table of (key, parent, seq, doc): the object's key is made
-// from its key fields, its parent from its parent field, seq keeps the
-// library's order, and doc is the object itself as JSON. A host profile is the
+// object is a row (section, key, parent, seq, doc) of one table: section
+// names its collection, the object's key is made from its key fields, its
+// parent from its parent field, seq keeps the library's order within the
+// collection, and doc is the object itself as JSON. A host profile is the
 // same data as one JSON document (docs/host-profile.md); dump and load turn
 // one into the other.
 //
-// Only the host-control library and the host simulator tool use this header.
+// Only the host-control library, the host simulator tool and the store's own
+// tests use this header; the library exports none of it.
 #pragma once
 
 #include <cstdint>
@@ -22,7 +24,9 @@
 
 #include <nlohmann/json.hpp>
 
-struct sqlite3;
+// Hidden wherever it is compiled, also in the library's own sources: no
+// shared object exports the store's code, nor code made from its types.
+#pragma GCC visibility push(hidden)
 
 namespace PldCtl {
 namespace Store {
@@ -30,10 +34,17 @@ namespace Store {
 using Json = nlohmann::json;
 
 // The store cannot be used at all: it cannot be created or opened, or the
-// file is damaged, truncated or not a host store. Deliberately not a
-// HostCtlException: commands report those as their own failure, while this
-// one means the host itself is unusable. The message names the file.
+// file is damaged, truncated or not a host store: the host itself is
+// unusable, which the library passes on as it is rather than as a failure of
+// one operation. The message names the file.
 class StoreError : public std::runtime_error {
+public:
+    using std::runtime_error::runtime_error;
+};
+
+// An injected fault fired (see HostStore::CheckFault). what() is the
+// fault's message, which the library reports as the operation's own failure.
+class InjectedFault : public std::runtime_error {
 public:
     using std::runtime_error::runtime_error;
 };
@@ -70,7 +81,7 @@ const std::vector<std::string>& Singletons();
 constexpr const char* kProfileFormat = "orvix-host-profile";
 constexpr int kProfileVersion = 1;
 // The schema version of the database file (PRAGMA user_version).
-constexpr int kSchemaVersion = 1;
+constexpr int kSchemaVersion = 2;
 
 // The embedded default host.
 const std::string& DefaultProfileText();
@@ -88,8 +99,8 @@ std::string ReadProfileFile(const std::string& file);
 // order of Singletons() and Collections()).
 std::string FormatProfile(const Json& profile);
 
-// An injected fault: an operation named "Class::Operation" throws
-// HostCtlException with this message; with a key, only for that object.
+// An injected fault: an operation named "Class::Operation" fails with this
+// message; with a key, only for that object.
 // remaining: how many more times it fires; nullopt means every time.
 struct Fault {
     std::int64_t id = 0;
@@ -129,8 +140,7 @@ public:
     std::int64_t MaxIntegerKey(const std::string& section);
     // The objects that pass every test, counted per parent (or per value of
     // `field`), in one pass over the collection; groups with none are absent.
-    std::map<std::string, std::int64_t> CountByParent(const std::string& section,
-                                                      const std::vector<FieldTest>& tests);
+    std::map<std::string, std::int64_t> CountByParent(const std::string& section, const std::vector<FieldTest>& tests);
     std::map<std::string, std::int64_t> CountByField(const std::string& section, const std::string& field,
                                                      const std::vector<FieldTest>& tests);
     // Every object of a collection with a parent section, ordered by its
@@ -222,12 +232,12 @@ public:
     Json Dump();
     void Load(const Json& profile);
 
-    // Throws HostCtl::Lib::HostCtlException with the message of the first
-    // fault that matches the operation and key (a fault without key matches
-    // every key), using up one firing of a counted fault. A store without
-    // faults when first asked is taken to stay without (unless this process
-    // adds one), so the check costs nothing on a host nobody tests; a fault
-    // armed by another process meanwhile is seen by processes started later.
+    // Throws InjectedFault with the message of the first fault that matches
+    // the operation and key (a fault without key matches every key), using
+    // up one firing of a counted fault. A store without faults when first
+    // asked is taken to stay without (unless this process adds one), so the
+    // check costs nothing on a host nobody tests; a fault armed by another
+    // process meanwhile is seen by processes started later.
     void CheckFault(const std::string& operation, const std::string& key = std::string());
     std::vector<Fault> ListFaults();
     std::int64_t AddFault(const Fault& fault);
@@ -248,3 +258,5 @@ private:
 
 }  // namespace Store
 }  // namespace PldCtl
+
+#pragma GCC visibility pop

@@ -1,14 +1,18 @@
 // Standard switches, port groups and their policies as the library keeps
 // them: the host's rules and their messages, and what every change leaves
 // in the store.
-#include <gtest/gtest.h>
+#include <cstdio>
 
+#include <gtest/gtest.h>
+#include <nlohmann/json.hpp>
+
+#include "hostctl/HostSession.h"
 #include "hostctl/Lib.h"
 #include "hostctl/network/NetworkInfoImpl.h"
 #include "hostctl/network/NetworkFactory.h"
 #include "hostctl/network/nic/PnicImpl.h"
 #include "hostctl/network/vswitch/SwitchImpl.h"
-#include "support/store_test_util.h"
+#include "support/test_util.h"
 
 namespace {
 
@@ -18,15 +22,38 @@ using HostCtl::Network::NicTeamingPolicy;
 using HostCtl::Network::PortSecurityPolicy;
 using HostCtl::Network::ShapingPolicy;
 using PldCtl::Network::VirtualSwitchInfoImpl;
-using PldCtl::Store::HostStore;
+using Json = nlohmann::json;
 
 // Each test works on a fresh copy of the default host.
 class Switches : public ::testing::Test {
 protected:
     Switches() : db_("ORVIX_HOST_DB", dir_ / "host.db"), profile_("ORVIX_HOST_PROFILE", std::nullopt) {
-        HostStore::ResetDefault();
+        PldCtl::Lib::ReopenHost();
     }
-    ~Switches() override { HostStore::ResetDefault(); }
+    ~Switches() override { PldCtl::Lib::ReopenHost(); }
+
+    // Runs orvix-hostsim on the test's host and returns what it printed: the
+    // store is private to the library, so the tests look into it and arm
+    // faults the way any other program does.
+    static std::string HostSim(const std::string& arguments) {
+        const std::string command = "'" ORVIX_BIN_DIR "/orvix-hostsim' " + arguments;
+        FILE* pipe = popen(command.c_str(), "r");
+        if (!pipe) throw std::runtime_error("cannot run " + command);
+        std::string out;
+        char buffer[4096];
+        for (std::size_t n; (n = std::fread(buffer, 1, sizeof buffer, pipe)) > 0;) out.append(buffer, n);
+        if (pclose(pipe) != 0) throw std::runtime_error(command + " failed");
+        return out;
+    }
+
+    // The stored objects of a collection whose `field` equals `value`.
+    static std::vector<Json> Stored(const std::string& section, const std::string& field, const Json& value) {
+        std::vector<Json> found;
+        for (const Json& object : Json::parse(HostSim("dump")).value(section, Json::array())) {
+            if (object.value(field, Json()) == value) found.push_back(object);
+        }
+        return found;
+    }
 
     std::unique_ptr<HostCtl::Network::VirtualSwitch> Switch(const std::string& name) {
         auto vswitch = NetworkFactory::GetVirtualSwitchById(name);
@@ -113,7 +140,7 @@ TEST_F(Switches, AddAndRemoveSwitchesWithinTheHostsRules) {
               "db01.eth1");
     info_.RemoveVirtualSwitch("vSwitch1");
     EXPECT_EQ(NetworkFactory::GetPortGroupByName("Lab Isolated"), nullptr);
-    EXPECT_EQ(HostStore::Default().CountChildren("ports", "vSwitch1"), 0);
+    EXPECT_TRUE(Stored("ports", "portset", "vSwitch1").empty());
     EXPECT_EQ(MessageOf([&] { info_.RemoveVirtualSwitch("vSwitch1"); }),
               "Unable to find virtual switch with the name vSwitch1");
 }
@@ -143,12 +170,12 @@ TEST_F(Switches, UplinksTakeAPortAndComeBackFree) {
     vswitch->AddUplink("hwnic4");
     EXPECT_EQ(vswitch->GetUplinks(), std::vector<std::string>{"hwnic4"});
     EXPECT_EQ(vswitch->GetNumUsedPorts(), 1);
-    const auto nic = HostStore::Default().Get("nics", "hwnic4");
-    ASSERT_TRUE(nic);
-    const auto port = HostStore::Default().Get("ports", std::to_string((*nic)["uplinkPortId"].get<long long>()));
-    ASSERT_TRUE(port);
-    EXPECT_EQ((*port)["client"], "hwnic4");
-    EXPECT_EQ((*port)["portset"], "vSwitch1");
+    const auto nic = Stored("nics", "name", "hwnic4");
+    ASSERT_EQ(nic.size(), 1u);
+    const auto port = Stored("ports", "id", nic[0]["uplinkPortId"]);
+    ASSERT_EQ(port.size(), 1u);
+    EXPECT_EQ(port[0]["client"], "hwnic4");
+    EXPECT_EQ(port[0]["portset"], "vSwitch1");
 
     EXPECT_EQ(MessageOf([&] { Switch("vSwitch0")->AddUplink("hwnic4"); }),
               "Unable to add uplink hwnic4: it is already an uplink of vSwitch1");
@@ -162,7 +189,7 @@ TEST_F(Switches, UplinksTakeAPortAndComeBackFree) {
     vswitch->RemoveUplink("hwnic4", false);
     EXPECT_TRUE(vswitch->GetUplinks().empty());
     EXPECT_EQ(vswitch->GetNumUsedPorts(), 0);
-    EXPECT_EQ((*HostStore::Default().Get("nics", "hwnic4"))["uplinkPortId"], 0);
+    EXPECT_EQ(Stored("nics", "name", "hwnic4").at(0)["uplinkPortId"], 0);
 
     // Removing an uplink leaves the failover policies alone unless asked.
     auto vSwitch0 = Switch("vSwitch0");
@@ -273,7 +300,7 @@ TEST_F(Switches, PolicyEditsFromOlderSnapshotsKeepEachOther) {
 }
 
 TEST_F(Switches, InjectedFaultsReachTheirOperation) {
-    HostStore::Default().AddFault({0, "VirtualSwitchImpl::SetMTU", "vSwitch1", "MTU change refused by the driver", 1});
+    HostSim("fault add VirtualSwitchImpl::SetMTU --key vSwitch1 --message 'MTU change refused by the driver' --count 1");
     EXPECT_EQ(Switch("vSwitch0")->GetMTU(), 1500);
     auto vswitch = Switch("vSwitch1");
     EXPECT_EQ(MessageOf([&] { vswitch->SetMTU(9000); }), "MTU change refused by the driver");

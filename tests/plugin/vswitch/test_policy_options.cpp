@@ -6,7 +6,8 @@
 #include <gtest/gtest.h>
 
 #include "framework/Runner.h"
-#include "support/store_test_util.h"
+#include "hostctl/HostSession.h"
+#include "support/test_util.h"
 #include "vswitch/VswitchOptions.h"
 #include "vswitch/VswitchRecords.h"
 
@@ -29,9 +30,9 @@ NicTeamingPolicy Teaming(const Names& order, int maxActive) {
 class PolicyOptions : public ::testing::Test {
 protected:
     PolicyOptions() : db_("ORVIX_HOST_DB", dir_ / "host.db"), profile_("ORVIX_HOST_PROFILE", std::nullopt) {
-        PldCtl::Store::HostStore::ResetDefault();
+        PldCtl::Lib::ReopenHost();
     }
-    ~PolicyOptions() override { PldCtl::Store::HostStore::ResetDefault(); }
+    ~PolicyOptions() override { PldCtl::Lib::ReopenHost(); }
 
     // Applies failover options to `edited`, with `reference` as the policy
     // shown to the user; returns the errors reported.

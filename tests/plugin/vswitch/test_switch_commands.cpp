@@ -12,8 +12,8 @@
 #include <gtest/gtest.h>
 
 #include "hostctl/network/NetworkFactory.h"
-#include "hoststore/HostStore.h"
-#include "support/store_test_util.h"
+#include "hostctl/HostSession.h"
+#include "support/test_util.h"
 #include "vswitch/VirtualSwitchStandardList.h"
 #include "vswitch/VirtualSwitchStandardSet.h"
 #include "vswitch/VirtualSwitchStandardUplinkAdd.h"
@@ -53,9 +53,9 @@ bool IsTrueResult(const CallSpec::Output& output) {
 class SwitchCommands : public ::testing::Test {
 protected:
     SwitchCommands() : db_("ORVIX_HOST_DB", dir_ / "host.db"), profile_("ORVIX_HOST_PROFILE", std::nullopt) {
-        PldCtl::Store::HostStore::ResetDefault();
+        PldCtl::Lib::ReopenHost();
     }
-    ~SwitchCommands() override { PldCtl::Store::HostStore::ResetDefault(); }
+    ~SwitchCommands() override { PldCtl::Lib::ReopenHost(); }
 
     static std::unique_ptr<HostCtl::Network::VirtualSwitch> Switch(const std::string& name) {
         auto vswitch = NetworkFactory::GetVirtualSwitchById(name);
