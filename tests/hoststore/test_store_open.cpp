@@ -144,11 +144,11 @@ TEST(StoreOpenTest, DefaultStoreFromABadProfile) {
 TEST(StoreOpenTest, RacingCreatorsAllOpenTheWinnersStore) {
     OrvixTest::TempDir dir;
     const std::string path = dir / "race/host.db";
-    constexpr int kCreators = 6;
+    constexpr std::size_t kCreators = 6;
     std::vector<std::string> hostnames(kCreators);
     std::vector<std::string> errors(kCreators);
     std::vector<std::thread> threads;
-    for (int i = 0; i < kCreators; ++i) {
+    for (std::size_t i = 0; i < hostnames.size(); ++i) {
         threads.emplace_back([&, i] {
             try {
                 const Json profile = {{"format", "orvix-host-profile"},
@@ -166,7 +166,7 @@ TEST(StoreOpenTest, RacingCreatorsAllOpenTheWinnersStore) {
         });
     }
     for (auto& thread : threads) thread.join();
-    for (int i = 0; i < kCreators; ++i) {
+    for (std::size_t i = 0; i < hostnames.size(); ++i) {
         EXPECT_EQ(errors[i], "");
         EXPECT_EQ(hostnames[i], hostnames[0]);
     }

@@ -96,7 +96,7 @@ TEST(StoreConcurrencyTest, KilledWritersLeaveAWholeStore) {
         // Exactly worlds 1..counter, in order: every change whole or absent.
         const auto worlds = store->List("worlds");
         ASSERT_EQ(worlds.size(), std::size_t(counter));
-        for (std::int64_t i = 0; i < counter; ++i) ASSERT_EQ(worlds[i].at("id"), i + 1);
+        for (std::size_t i = 0; i < worlds.size(); ++i) ASSERT_EQ(worlds[i].at("id"), std::int64_t(i) + 1);
         done = counter;
     }
     // The kills came while changes were being made, not only before the first.
