@@ -15,7 +15,8 @@ export ORVIX_HOST_DB=$work/host.db
 unset ORVIX_PLUGIN_PATH ORVIX_HOST_PROFILE
 out=$(env -u LD_LIBRARY_PATH "$work/moved/bin/orvixcli" network vswitch standard list --formatter=json)
 grep -q '"Name": "vSwitch0"' <<<"$out" || { echo "installed orvixcli printed: $out" >&2; exit 1; }
-"$work/moved/bin/orvix-hostsim" dump | grep -q '"format": "orvix-host-profile"'
+dump=$("$work/moved/bin/orvix-hostsim" dump)
+grep -q '"format": "orvix-host-profile"' <<<"$dump" || { echo "installed orvix-hostsim dumped: $dump" >&2; exit 1; }
 # No installed program or library may still look for libraries in the
 # build tree.
 for file in "$work"/moved/bin/* "$work"/moved/lib/*.so "$work"/moved/lib/orvixcli/plugins/*.so; do
