@@ -209,5 +209,56 @@ void Transaction::PutSingleton(const std::string& name, const Json& object) {
         .Run();
 }
 
+// ---- Stored text -----------------------------------------------------------
+// The reads above without the parsing: the same statements, each row's
+// document handed out as text.
+
+namespace {
+
+std::vector<std::string> Texts(Sql::Query& query) {
+    std::vector<std::string> texts;
+    while (query.Next()) texts.push_back(query.Text(0));
+    return texts;
+}
+
+}  // namespace
+
+std::optional<std::string> Transaction::GetText(const std::string& section, const std::string& key) {
+    auto query = Statement(store_.impl_->db, section, "SELECT doc FROM %T WHERE key = ?1");
+    query.Bind(1, key);
+    if (!query.Next()) return std::nullopt;
+    return query.Text(0);
+}
+
+std::vector<std::string> Transaction::ListText(const std::string& section) {
+    auto query = Statement(store_.impl_->db, section, "SELECT doc FROM %T ORDER BY seq");
+    return Texts(query);
+}
+
+std::vector<std::string> Transaction::ListChildrenText(const std::string& section, const std::string& parent) {
+    auto query = Statement(store_.impl_->db, section, "SELECT doc FROM %T WHERE parent = ?1 ORDER BY seq");
+    query.Bind(1, parent);
+    return Texts(query);
+}
+
+std::vector<std::string> Transaction::ListByParentOrderText(const std::string& section) {
+    const CollectionInfo& collection = Collection(section);
+    if (!collection.parentSection) {
+        throw std::invalid_argument(section + ": its objects have no parent section to be ordered by");
+    }
+    const std::string sql = "SELECT c.doc FROM %T AS c JOIN " + Sql::Quote(collection.parentSection) +
+                            " AS p ON p.key = c.parent ORDER BY p.seq, c.seq";
+    auto query = store_.impl_->db.Prepare(TableSql(section, sql.c_str()));
+    return Texts(query);
+}
+
+std::string Transaction::GetSingletonText(const std::string& name) {
+    RequireSingleton(name);
+    auto query = store_.impl_->db.Prepare("SELECT doc FROM singleton WHERE name = ?1");
+    return query.Bind(1, name).Next() ? query.Text(0) : std::string("{}");
+}
+
+// ---- end of stored text -----------------------------------------------------
+
 }  // namespace Store
 }  // namespace PldCtl
