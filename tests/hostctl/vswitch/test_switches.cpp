@@ -156,22 +156,18 @@ TEST_F(Switches, UplinksTakeAPortAndComeBackFree) {
               "Unable to add uplink hwnic2: it is already an uplink of dvSwitch0");
     EXPECT_EQ(MessageOf([&] { vswitch->AddUplink("hwnic9"); }),
               "Unable to add uplink hwnic9: the host has no physical NIC of that name");
-    EXPECT_EQ(MessageOf([&] { vswitch->RemoveUplink("hwnic0", false); }),
+    EXPECT_EQ(MessageOf([&] { vswitch->RemoveUplink("hwnic0"); }),
               "Unable to remove uplink hwnic0: it is not an uplink of virtual switch vSwitch1");
 
-    vswitch->RemoveUplink("hwnic4", false);
+    vswitch->RemoveUplink("hwnic4");
     EXPECT_TRUE(vswitch->GetUplinks().empty());
     EXPECT_EQ(vswitch->GetNumUsedPorts(), 0);
     EXPECT_EQ((*HostStore::Default().Get("nics", "hwnic4"))["uplinkPortId"], 0);
 
-    // Removing an uplink leaves the failover policies alone unless asked.
+    // Removing an uplink leaves the failover policies alone.
     auto vSwitch0 = Switch("vSwitch0");
-    vSwitch0->RemoveUplink("hwnic1", false);
+    vSwitch0->RemoveUplink("hwnic1");
     EXPECT_EQ(vSwitch0->GetTeamingPolicy().GetUplinkOrder(), (std::vector<std::string>{"hwnic0", "hwnic1"}));
-    vSwitch0->AddUplink("hwnic1");
-    vSwitch0->RemoveUplink("hwnic0", true);
-    EXPECT_EQ(vSwitch0->GetTeamingPolicy().GetUplinkOrder(), std::vector<std::string>{"hwnic1"});
-    EXPECT_EQ(vSwitch0->GetTeamingPolicy().GetMaxActiveUplinks(), 0);
 }
 
 TEST_F(Switches, PortGroupsComeAndGoUnlessInUse) {
