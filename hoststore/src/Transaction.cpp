@@ -258,6 +258,42 @@ std::string Transaction::GetSingletonText(const std::string& name) {
     return query.Bind(1, name).Next() ? query.Text(0) : std::string("{}");
 }
 
+std::vector<std::string> Transaction::ListKeys(const std::string& section) {
+    auto query = Statement(store_.impl_->db, section, "SELECT key FROM %T ORDER BY seq");
+    return Texts(query);
+}
+
+std::unordered_map<std::string, Transaction::GroupCount> Transaction::CountGroups(const std::string& section,
+                                                                                  const std::string& byField,
+                                                                                  const std::vector<FieldTest>& tests) {
+    const CollectionInfo& collection = Collection(section);
+    // The tests as one condition: Conditions() gives " WHERE a AND b" and
+    // binds its values from ?1 on.
+    std::vector<std::string> bindings;
+    const std::string where = Conditions(collection, tests, false, bindings);
+    const std::string kWhere = " WHERE ";
+    const std::string passes = where.empty() ? "1" : "(" + where.substr(kWhere.size()) + ")";
+    std::string group = "parent";
+    if (!byField.empty()) {
+        group = ColumnOf(collection, byField);
+        if (group.empty()) {
+            bindings.push_back("$.\"" + byField + "\"");
+            group = "json_extract(doc, ?" + std::to_string(bindings.size()) + ")";
+        }
+        group = "CAST(" + group + " AS TEXT)";
+    }
+    auto query = Statement(store_.impl_->db, section, ("SELECT " + group + ", " + passes + " FROM %T").c_str());
+    for (std::size_t i = 0; i < bindings.size(); ++i) query.Bind(static_cast<int>(i + 1), bindings[i]);
+    std::unordered_map<std::string, GroupCount> counts;
+    while (query.Next()) {
+        if (query.IsNull(0)) continue;
+        GroupCount& count = counts[query.Text(0)];
+        ++count.all;
+        if (query.Int(1) != 0) ++count.passing;
+    }
+    return counts;
+}
+
 // ---- end of stored text -----------------------------------------------------
 
 }  // namespace Store

@@ -18,6 +18,7 @@
 #include <optional>
 #include <stdexcept>
 #include <string>
+#include <unordered_map>
 #include <vector>
 
 #include <nlohmann/json.hpp>
@@ -157,6 +158,18 @@ public:
     std::vector<std::string> ListByParentOrderText(const std::string& section);
     // "{}" when the singleton was never written.
     std::string GetSingletonText(const std::string& name);
+    // The keys of a collection's objects, in its order.
+    std::vector<std::string> ListKeys(const std::string& section);
+    // The objects of a collection counted per parent (`byField` empty) or per
+    // value of a field, in one pass over the rows as they are stored, with no
+    // sorting: for each group, all its objects and those of them that pass
+    // every test. Objects with no parent or no value are not counted.
+    struct GroupCount {
+        std::int64_t all = 0;
+        std::int64_t passing = 0;
+    };
+    std::unordered_map<std::string, GroupCount> CountGroups(const std::string& section, const std::string& byField,
+                                                            const std::vector<FieldTest>& tests);
     // ---- end of stored text ------------------------------------------------
 
 private:
