@@ -7,7 +7,7 @@ set -euo pipefail
 packages=(
   build-essential cmake ninja-build pkg-config
   libboost-dev
-  libsqlite3-dev nlohmann-json3-dev libsimdjson-dev
+  libsqlite3-dev nlohmann-json3-dev
   libgtest-dev libgmock-dev
 )
 

@@ -1,5 +1,7 @@
 #include "hostctl/network/NetworkInfoImpl.h"
 
+#include <unordered_map>
+
 #include "Operation.h"
 #include "hostctl/network/nic/PnicImpl.h"
 #include "hostctl/network/vswitch/SwitchImpl.h"
@@ -47,13 +49,21 @@ std::vector<std::unique_ptr<HostCtl::Network::PortGroup>> NetworkInfoImpl::GetAl
     store.Read([&](Store::Transaction& t) {
         // Port group names are unique on the host, so the in-use ports of all
         // port groups are counted in one pass, by port group name.
-        const auto active = t.CountByField(PortRecord::kSection, PortRecord::kPortGroupField,
-                                           {Store::FieldTest{PortRecord::kClientField, std::nullopt}});
-        for (const std::string& text : t.ListByParentOrderText(PortGroupRecord::kSection)) {
-            auto portGroup = std::make_shared<const PortGroupRecord>(Detail::Decode<PortGroupRecord>(text));
-            auto count = active.find(portGroup->name);
-            portGroups.push_back(std::make_unique<PortGroupImpl>(
-                std::move(portGroup), count == active.end() ? 0 : static_cast<int>(count->second)));
+        const auto active = t.CountGroups(PortRecord::kSection, PortRecord::kPortGroupField,
+                                          {Store::FieldTest{PortRecord::kClientField, std::nullopt}});
+        // Switch by switch, each switch's port groups in their order.
+        std::unordered_map<std::string, std::vector<std::shared_ptr<const PortGroupRecord>>> bySwitch;
+        for (auto& portGroup : Detail::DecodeShared<PortGroupRecord>(t.ListText(PortGroupRecord::kSection))) {
+            bySwitch[portGroup->vswitch].push_back(std::move(portGroup));
+        }
+        for (const std::string& vswitch : t.ListKeys(Detail::VswitchRecord::kSection)) {
+            auto own = bySwitch.find(vswitch);
+            if (own == bySwitch.end()) continue;
+            for (auto& portGroup : own->second) {
+                auto count = active.find(portGroup->name);
+                const int activeClients = count == active.end() ? 0 : static_cast<int>(count->second.passing);
+                portGroups.push_back(std::make_unique<PortGroupImpl>(std::move(portGroup), activeClients));
+            }
         }
     });
     return portGroups;

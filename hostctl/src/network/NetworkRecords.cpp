@@ -5,11 +5,16 @@
 namespace PldCtl {
 namespace Detail {
 
+// clang-format off
 template <>
 struct RecordFields<SystemRecord> {
-    static constexpr auto kAll =
-        std::make_tuple(Field("ipv6Enabled", &SystemRecord::ipv6Enabled), Field("maxPorts", &SystemRecord::maxPorts));
+    static constexpr auto All() {
+        return std::make_tuple(
+            Field("ipv6Enabled", &SystemRecord::ipv6Enabled),
+            Field("maxPorts", &SystemRecord::maxPorts));
+    }
 };
+// clang-format on
 
 }  // namespace Detail
 }  // namespace PldCtl

@@ -1,11 +1,9 @@
 // The definitions behind StoredRecord.h, for the *Records.cpp files only:
 // each describes its records with RecordFields and instantiates the
 // functions for them (STORED_RECORD below). Objects are decoded with
-// simdjson's on-demand parser, which builds no document tree: a field the
-// record does not name is skipped, not parsed.
+// JsonReader, which builds no document tree: a field the record does not
+// name is skipped, not kept.
 #pragma once
-
-#include <simdjson.h>
 
 #include <cmath>
 #include <cstdint>
@@ -18,6 +16,7 @@
 #include <utility>
 #include <vector>
 
+#include "network/StoredJson.h"
 #include "network/StoredRecord.h"
 
 namespace PldCtl {
@@ -36,31 +35,22 @@ constexpr FieldOf<Record, T> Field(std::string_view name, T Record::*member) {
     return {name, member};
 }
 
-// Specialised for each record type: `static constexpr auto kAll =
-// std::make_tuple(Field("name", &Record::name), ...);`
+// Specialised for each record type: `static constexpr auto All() { return
+// std::make_tuple(Field("name", &Record::name), ...); }`
 template <typename Record>
 struct RecordFields;
 
 template <typename T, typename = void>
 struct IsRecord : std::false_type {};
 template <typename T>
-struct IsRecord<T, std::void_t<decltype(RecordFields<T>::kAll)>> : std::true_type {};
+struct IsRecord<T, std::void_t<decltype(RecordFields<T>::All())>> : std::true_type {};
 
 template <typename Record, typename Fn>
 void ForEachField(Fn&& fn) {
-    std::apply([&](const auto&... field) { (fn(field), ...); }, RecordFields<Record>::kAll);
+    std::apply([&](const auto&... field) { (fn(field), ...); }, RecordFields<Record>::All());
 }
 
 namespace Codec {
-
-using Value = simdjson::ondemand::value;
-
-// The thread's parser started on a copy of `text` with the padding the
-// parser reads ahead into; the document lives until the next call.
-simdjson::ondemand::document& Iterate(std::string_view text);
-
-// The error of a damaged store, thrown when an object does not decode.
-[[noreturn]] void ThrowDamaged();
 
 template <typename Int>
 bool AssignInteger(std::int64_t value, Int& out) {
@@ -80,34 +70,45 @@ bool AssignInteger(std::uint64_t value, Int& out) {
     return true;
 }
 
-// Each Read returns whether the value had the member's type; when it had
-// not, the member keeps what it held.
-inline bool Read(Value& value, std::string& out) {
-    std::string_view text;
-    if (value.get_string().get(text)) return false;
-    out.assign(text);
+// Each Read takes the value at the reader into the member and returns true,
+// or, for a value of another type, skips it, leaves the member as it was and
+// returns false.
+inline bool Read(JsonReader& reader, std::string& out) {
+    if (reader.Next() != JsonReader::Kind::String) {
+        reader.Skip();
+        return false;
+    }
+    out.assign(reader.String());
     return true;
 }
 
-inline bool Read(Value& value, bool& out) {
-    return !value.get_bool().get(out);
+inline bool Read(JsonReader& reader, bool& out) {
+    if (reader.Next() != JsonReader::Kind::Bool) {
+        reader.Skip();
+        return false;
+    }
+    out = reader.Bool();
+    return true;
 }
 
 // Integers outside the member's range do not fit it; a number written with a
 // fraction or exponent counts when its value is a whole number.
 template <typename Int, std::enable_if_t<std::is_integral_v<Int> && !std::is_same_v<Int, bool>, int> = 0>
-bool Read(Value& value, Int& out) {
-    simdjson::ondemand::number number;
-    if (value.get_number().get(number)) return false;
-    switch (number.get_number_type()) {
-        case simdjson::ondemand::number_type::signed_integer:
-            return AssignInteger(number.get_int64(), out);
-        case simdjson::ondemand::number_type::unsigned_integer:
-            return AssignInteger(number.get_uint64(), out);
-        case simdjson::ondemand::number_type::floating_point_number:
+bool Read(JsonReader& reader, Int& out) {
+    if (reader.Next() != JsonReader::Kind::Number) {
+        reader.Skip();
+        return false;
+    }
+    const JsonReader::Number number = reader.ReadNumber();
+    switch (number.kind) {
+        case JsonReader::Number::Signed:
+            return AssignInteger(number.signedValue, out);
+        case JsonReader::Number::Unsigned:
+            return AssignInteger(number.unsignedValue, out);
+        case JsonReader::Number::Real:
             break;
     }
-    const double real = number.get_double();
+    const double real = number.realValue;
     // 2^63 is exact in a double; anything at or above it is no int64.
     if (real != std::trunc(real) || real < -9223372036854775808.0 || real >= 9223372036854775808.0) {
         return false;
@@ -115,50 +116,58 @@ bool Read(Value& value, Int& out) {
     return AssignInteger(static_cast<std::int64_t>(real), out);
 }
 
-inline bool Read(Value& value, std::vector<std::string>& out) {
-    simdjson::ondemand::array array;
-    if (value.get_array().get(array)) return false;
-    std::vector<std::string> items;
-    for (auto element : array) {
-        std::string_view text;
-        // One item of another type makes the whole field so.
-        if (element.get_string().get(text)) return false;
-        items.emplace_back(text);
+inline bool Read(JsonReader& reader, std::vector<std::string>& out) {
+    if (reader.Next() != JsonReader::Kind::Array) {
+        reader.Skip();
+        return false;
     }
-    out = std::move(items);
-    return true;
+    std::vector<std::string> items;
+    // One item of another type makes the whole field so.
+    bool names = true;
+    reader.BeginArray();
+    while (reader.NextItem()) {
+        std::string item;
+        names = Read(reader, item) && names;
+        if (names) items.push_back(std::move(item));
+    }
+    if (names) out = std::move(items);
+    return names;
 }
 
 template <typename T>
-bool Read(Value& value, std::optional<T>& out) {
+bool Read(JsonReader& reader, std::optional<T>& out) {
     T read{};
-    if (!Read(value, read)) return false;
+    if (!Read(reader, read)) return false;
     out = std::move(read);
     return true;
 }
 
 template <typename Record>
-void ReadFields(simdjson::ondemand::object& object, Record& record);
+void ReadFields(JsonReader& reader, Record& record);
 
 template <typename Record, std::enable_if_t<IsRecord<Record>::value, int> = 0>
-bool Read(Value& value, Record& out) {
-    simdjson::ondemand::object object;
-    if (value.get_object().get(object)) return false;
-    ReadFields(object, out);
+bool Read(JsonReader& reader, Record& out) {
+    if (reader.Next() != JsonReader::Kind::Object) {
+        reader.Skip();
+        return false;
+    }
+    ReadFields(reader, out);
     return true;
 }
 
+// A member the record does not name is skipped; of members named twice the
+// last one counts, as when the store's writer reads the object.
 template <typename Record>
-void ReadFields(simdjson::ondemand::object& object, Record& record) {
-    for (auto field : object) {
-        std::string_view key;
-        Value value;
-        if (field.unescaped_key().get(key) || field.value().get(value)) ThrowDamaged();
-        std::apply(
-            [&](const auto&... known) {
-                (void)((key == known.name && (Read(value, record.*(known.member)), true)) || ...);
+void ReadFields(JsonReader& reader, Record& record) {
+    reader.BeginObject();
+    std::string_view key;
+    while (reader.NextKey(key)) {
+        const bool known = std::apply(
+            [&](const auto&... field) {
+                return ((key == field.name && (Read(reader, record.*(field.member)), true)) || ...);
             },
-            RecordFields<Record>::kAll);
+            RecordFields<Record>::All());
+        if (!known) reader.Skip();
     }
 }
 
@@ -223,9 +232,9 @@ void MergeField(Store::Json& stored, std::string_view name, const std::optional<
 template <typename Record>
 Record Decode(std::string_view text) {
     Record record;
-    simdjson::ondemand::object object;
-    if (Codec::Iterate(text).get_object().get(object)) Codec::ThrowDamaged();
-    Codec::ReadFields(object, record);
+    JsonReader reader(text);
+    Codec::ReadFields(reader, record);
+    reader.End();
     return record;
 }
 

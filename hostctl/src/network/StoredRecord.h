@@ -14,6 +14,7 @@
 // in a profile) survive every change.
 #pragma once
 
+#include <memory>
 #include <optional>
 #include <string>
 #include <string_view>
@@ -77,6 +78,19 @@ std::vector<Record> ListChildren(Source& source, const std::string& parent) {
     std::vector<Record> records;
     for (const std::string& text : source.ListChildrenText(Record::kSection, parent)) {
         records.push_back(Decode<Record>(text));
+    }
+    return records;
+}
+
+// Records to share among the objects of a listing. Each text is released as
+// soon as it is decoded, so its memory serves the records that follow.
+template <typename Record>
+std::vector<std::shared_ptr<const Record>> DecodeShared(std::vector<std::string>&& texts) {
+    std::vector<std::shared_ptr<const Record>> records;
+    records.reserve(texts.size());
+    for (std::string& text : texts) {
+        records.push_back(std::make_shared<const Record>(Decode<Record>(text)));
+        std::string().swap(text);
     }
     return records;
 }

@@ -5,11 +5,16 @@
 namespace PldCtl {
 namespace Detail {
 
+// clang-format off
 template <>
 struct RecordFields<DvSwitchRecord> {
-    static constexpr auto kAll =
-        std::make_tuple(Field("name", &DvSwitchRecord::name), Field("uplinks", &DvSwitchRecord::uplinks));
+    static constexpr auto All() {
+        return std::make_tuple(
+            Field("name", &DvSwitchRecord::name),
+            Field("uplinks", &DvSwitchRecord::uplinks));
+    }
 };
+// clang-format on
 
 }  // namespace Detail
 }  // namespace PldCtl

@@ -5,11 +5,16 @@
 namespace PldCtl {
 namespace Detail {
 
+// clang-format off
 template <>
 struct RecordFields<NicRecord> {
-    static constexpr auto kAll =
-        std::make_tuple(Field("name", &NicRecord::name), Field("uplinkPortId", &NicRecord::uplinkPortId));
+    static constexpr auto All() {
+        return std::make_tuple(
+            Field("name", &NicRecord::name),
+            Field("uplinkPortId", &NicRecord::uplinkPortId));
+    }
 };
+// clang-format on
 
 }  // namespace Detail
 }  // namespace PldCtl

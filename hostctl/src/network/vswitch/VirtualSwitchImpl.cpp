@@ -169,11 +169,14 @@ std::vector<std::string> VirtualSwitchImpl::GetBeaconRequiredBy() const {
     // Each operation stays a place a fault can be injected, also when a
     // listing already read what it needs.
     Detail::EnterOperation("VirtualSwitchImpl::GetBeaconRequiredBy", GetName());
-    const NicTeamingPolicy switchPolicy = Detail::SwitchPolicy<NicTeamingPolicy>(*record_);
+    const bool switchProbes = IsBeaconEnabled();
     std::vector<std::string> names;
     for (const auto& portGroup : PortGroupRecords()) {
+        // The port group's own failure detection, if it sets one, else its
+        // switch's (the policy in force, as InForce in PortGroupImpl.cpp).
         const NicTeamingPolicy own = Detail::OwnPolicy<NicTeamingPolicy>(*portGroup);
-        if (switchPolicy.OverlaidWith(own).GetLinkCriteria().IsBeaconChecking()) names.push_back(portGroup->name);
+        const bool probes = own.IsLinkCriteriaSet() ? own.GetLinkCriteria().IsBeaconChecking() : switchProbes;
+        if (probes) names.push_back(portGroup->name);
     }
     return names;
 }

@@ -1,5 +1,5 @@
 // The host's standard switches: listing, finding, adding and removing them.
-#include <map>
+#include <unordered_map>
 
 #include "hostctl/Lib.h"
 #include "hostctl/network/vswitch/SwitchImpl.h"
@@ -32,22 +32,22 @@ std::vector<std::unique_ptr<VirtualSwitch>> VirtualSwitchInfoImpl::GetVirtualSwi
     // queries per switch: listing a thousand switches stays quick.
     std::vector<std::unique_ptr<VirtualSwitch>> switches;
     store.Read([&](Transaction& t) {
-        const auto configured = t.CountByParent(PortRecord::kSection, {});
-        const auto used = t.CountByParent(PortRecord::kSection, {FieldTest{PortRecord::kClientField, std::nullopt}});
-        std::map<std::string, std::vector<std::shared_ptr<const PortGroupRecord>>> portGroups;
-        for (const std::string& text : t.ListByParentOrderText(PortGroupRecord::kSection)) {
-            auto portGroup = std::make_shared<const PortGroupRecord>(Detail::Decode<PortGroupRecord>(text));
+        const auto ports =
+            t.CountGroups(PortRecord::kSection, std::string(), {FieldTest{PortRecord::kClientField, std::nullopt}});
+        // In the host's order, so each switch's port groups are in its order.
+        std::unordered_map<std::string, std::vector<std::shared_ptr<const PortGroupRecord>>> portGroups;
+        for (auto& portGroup : Detail::DecodeShared<PortGroupRecord>(t.ListText(PortGroupRecord::kSection))) {
             portGroups[portGroup->vswitch].push_back(std::move(portGroup));
         }
-        auto countOf = [](const std::map<std::string, std::int64_t>& counts, const std::string& name) {
-            auto it = counts.find(name);
-            return it == counts.end() ? 0 : static_cast<int>(it->second);
-        };
-        for (const std::string& text : t.ListText(VswitchRecord::kSection)) {
-            auto vswitch = std::make_shared<const VswitchRecord>(Detail::Decode<VswitchRecord>(text));
-            const std::string& name = vswitch->name;
-            const std::pair<int, int> portCounts(countOf(configured, name), countOf(used, name));
-            std::vector<std::shared_ptr<const PortGroupRecord>> ownPortGroups = std::move(portGroups[name]);
+        for (auto& vswitch : Detail::DecodeShared<VswitchRecord>(t.ListText(VswitchRecord::kSection))) {
+            auto counted = ports.find(vswitch->name);
+            const std::pair<int, int> portCounts =
+                counted == ports.end()
+                    ? std::make_pair(0, 0)
+                    : std::make_pair(static_cast<int>(counted->second.all), static_cast<int>(counted->second.passing));
+            auto own = portGroups.find(vswitch->name);
+            std::vector<std::shared_ptr<const PortGroupRecord>> ownPortGroups;
+            if (own != portGroups.end()) ownPortGroups = std::move(own->second);
             switches.push_back(
                 std::make_unique<VirtualSwitchImpl>(std::move(vswitch), portCounts, std::move(ownPortGroups)));
         }
@@ -71,15 +71,15 @@ std::unique_ptr<VirtualSwitch> VirtualSwitchInfoImpl::AddVirtualSwitchWithPolicy
         throw HostCtlException("Invalid number of ports " + std::to_string(numPorts) + ": a virtual switch has 1 to " +
                                std::to_string(Portset::MAX_NUM_PORTS) + " ports");
     }
-    auto created = std::make_shared<VswitchRecord>();
-    created->name = name;
-    created->numPorts = static_cast<int>(numPorts);
-    created->teaming = Detail::FromPolicy(NicTeamingPolicy::GetDefaultPolicy().OverlaidWith(teaming));
-    created->security = Detail::FromPolicy(PortSecurityPolicy::GetDefaultPolicy().OverlaidWith(security));
-    created->shaping = Detail::FromPolicy(ShapingPolicy::GetDefaultPolicy().OverlaidWith(shaping));
-    created->capabilities.checksumOffload = capabilities.GetChecksumOffload();
-    created->capabilities.segmentationOffload = capabilities.GetSegmentationOffload();
-    created->capabilities.vlanTagging = capabilities.GetVlanTagging();
+    VswitchRecord created;
+    created.name = name;
+    created.numPorts = static_cast<int>(numPorts);
+    created.teaming = Detail::FromPolicy(NicTeamingPolicy::GetDefaultPolicy().OverlaidWith(teaming));
+    created.security = Detail::FromPolicy(PortSecurityPolicy::GetDefaultPolicy().OverlaidWith(security));
+    created.shaping = Detail::FromPolicy(ShapingPolicy::GetDefaultPolicy().OverlaidWith(shaping));
+    created.capabilities.checksumOffload = capabilities.GetChecksumOffload();
+    created.capabilities.segmentationOffload = capabilities.GetSegmentationOffload();
+    created.capabilities.vlanTagging = capabilities.GetVlanTagging();
     Store::HostStore& store = Detail::EnterOperation("VirtualSwitchInfoImpl::AddVirtualSwitchWithPolicy", name);
     store.Change([&](Transaction& t) {
         if (t.Exists(VswitchRecord::kSection, name) || t.Exists(Detail::DvSwitchRecord::kSection, name)) {
@@ -96,9 +96,9 @@ std::unique_ptr<VirtualSwitch> VirtualSwitchInfoImpl::AddVirtualSwitchWithPolicy
                                    (numPorts == 1 ? " port: " : " ports: ") + std::to_string(allocated) +
                                    " of the host's " + std::to_string(limit) + " ports are allocated already");
         }
-        Detail::Create(t, *created);
+        Detail::Create(t, created);
     });
-    return std::make_unique<VirtualSwitchImpl>(std::move(created));
+    return std::make_unique<VirtualSwitchImpl>(std::make_shared<const VswitchRecord>(std::move(created)));
 }
 
 void VirtualSwitchInfoImpl::RemoveVirtualSwitch(const std::string& name) {

@@ -16,82 +16,98 @@ using HostCtl::Network::ShapingPolicy;
 // clang-format off
 template <>
 struct RecordFields<TeamingRecord> {
-    static constexpr auto kAll = std::make_tuple(
-        Field("loadBalancing", &TeamingRecord::loadBalancing),
-        Field("beacon", &TeamingRecord::beacon),
-        Field("notifySwitches", &TeamingRecord::notifySwitches),
-        Field("rollingRestoration", &TeamingRecord::rollingRestoration),
-        Field("uplinkOrder", &TeamingRecord::uplinkOrder),
-        Field("maxActive", &TeamingRecord::maxActive));
+    static constexpr auto All() {
+        return std::make_tuple(
+            Field("loadBalancing", &TeamingRecord::loadBalancing),
+            Field("beacon", &TeamingRecord::beacon),
+            Field("notifySwitches", &TeamingRecord::notifySwitches),
+            Field("rollingRestoration", &TeamingRecord::rollingRestoration),
+            Field("uplinkOrder", &TeamingRecord::uplinkOrder),
+            Field("maxActive", &TeamingRecord::maxActive));
+    }
 };
 
 template <>
 struct RecordFields<SecurityRecord> {
-    static constexpr auto kAll = std::make_tuple(
-        Field("allowPromiscuous", &SecurityRecord::allowPromiscuous),
-        Field("allowMacChange", &SecurityRecord::allowMacChange),
-        Field("allowForgedTransmits", &SecurityRecord::allowForgedTransmits));
+    static constexpr auto All() {
+        return std::make_tuple(
+            Field("allowPromiscuous", &SecurityRecord::allowPromiscuous),
+            Field("allowMacChange", &SecurityRecord::allowMacChange),
+            Field("allowForgedTransmits", &SecurityRecord::allowForgedTransmits));
+    }
 };
 
 template <>
 struct RecordFields<ShapingRecord> {
-    static constexpr auto kAll = std::make_tuple(
-        Field("enabled", &ShapingRecord::enabled),
-        Field("averageBps", &ShapingRecord::averageBps),
-        Field("peakBps", &ShapingRecord::peakBps),
-        Field("burstBytes", &ShapingRecord::burstBytes));
+    static constexpr auto All() {
+        return std::make_tuple(
+            Field("enabled", &ShapingRecord::enabled),
+            Field("averageBps", &ShapingRecord::averageBps),
+            Field("peakBps", &ShapingRecord::peakBps),
+            Field("burstBytes", &ShapingRecord::burstBytes));
+    }
 };
 
 template <>
 struct RecordFields<BeaconRecord> {
-    static constexpr auto kAll = std::make_tuple(
-        Field("interval", &BeaconRecord::interval),
-        Field("threshold", &BeaconRecord::threshold));
+    static constexpr auto All() {
+        return std::make_tuple(
+            Field("interval", &BeaconRecord::interval),
+            Field("threshold", &BeaconRecord::threshold));
+    }
 };
 
 template <>
 struct RecordFields<CapabilitiesRecord> {
-    static constexpr auto kAll = std::make_tuple(
-        Field("checksumOffload", &CapabilitiesRecord::checksumOffload),
-        Field("segmentationOffload", &CapabilitiesRecord::segmentationOffload),
-        Field("vlanTagging", &CapabilitiesRecord::vlanTagging));
+    static constexpr auto All() {
+        return std::make_tuple(
+            Field("checksumOffload", &CapabilitiesRecord::checksumOffload),
+            Field("segmentationOffload", &CapabilitiesRecord::segmentationOffload),
+            Field("vlanTagging", &CapabilitiesRecord::vlanTagging));
+    }
 };
 
 template <>
 struct RecordFields<VswitchRecord> {
-    static constexpr auto kAll = std::make_tuple(
-        Field("name", &VswitchRecord::name),
-        Field("class", &VswitchRecord::className),
-        Field(VswitchRecord::kNumPortsField, &VswitchRecord::numPorts),
-        Field("mtu", &VswitchRecord::mtu),
-        Field("cdp", &VswitchRecord::cdp),
-        Field("beacon", &VswitchRecord::beacon),
-        Field("uplinks", &VswitchRecord::uplinks),
-        Field("teaming", &VswitchRecord::teaming),
-        Field("security", &VswitchRecord::security),
-        Field("shaping", &VswitchRecord::shaping),
-        Field("capabilities", &VswitchRecord::capabilities));
+    static constexpr auto All() {
+        return std::make_tuple(
+            Field("name", &VswitchRecord::name),
+            Field("class", &VswitchRecord::className),
+            Field(VswitchRecord::kNumPortsField, &VswitchRecord::numPorts),
+            Field("mtu", &VswitchRecord::mtu),
+            Field("cdp", &VswitchRecord::cdp),
+            Field("beacon", &VswitchRecord::beacon),
+            Field("uplinks", &VswitchRecord::uplinks),
+            Field("teaming", &VswitchRecord::teaming),
+            Field("security", &VswitchRecord::security),
+            Field("shaping", &VswitchRecord::shaping),
+            Field("capabilities", &VswitchRecord::capabilities));
+    }
 };
 
 template <>
 struct RecordFields<PortGroupRecord> {
-    static constexpr auto kAll = std::make_tuple(
-        Field("name", &PortGroupRecord::name),
-        Field("vswitch", &PortGroupRecord::vswitch),
-        Field("vlanId", &PortGroupRecord::vlanId),
-        Field("teaming", &PortGroupRecord::teaming),
-        Field("security", &PortGroupRecord::security),
-        Field("shaping", &PortGroupRecord::shaping));
+    static constexpr auto All() {
+        return std::make_tuple(
+            Field("name", &PortGroupRecord::name),
+            Field("vswitch", &PortGroupRecord::vswitch),
+            Field("vlanId", &PortGroupRecord::vlanId),
+            Field("teaming", &PortGroupRecord::teaming),
+            Field("security", &PortGroupRecord::security),
+            Field("shaping", &PortGroupRecord::shaping));
+    }
 };
 
 template <>
 struct RecordFields<PortRecord> {
-    static constexpr auto kAll = std::make_tuple(
-        Field("id", &PortRecord::id),
-        Field("portset", &PortRecord::portset),
-        Field(PortRecord::kTypeField, &PortRecord::type),
-        Field(PortRecord::kClientField, &PortRecord::client),
-        Field(PortRecord::kPortGroupField, &PortRecord::portgroup));
+    static constexpr auto All() {
+        return std::make_tuple(
+            Field("id", &PortRecord::id),
+            Field("portset", &PortRecord::portset),
+            Field(PortRecord::kTypeField, &PortRecord::type),
+            Field(PortRecord::kClientField, &PortRecord::client),
+            Field(PortRecord::kPortGroupField, &PortRecord::portgroup));
+    }
 };
 // clang-format on
 
