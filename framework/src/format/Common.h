@@ -24,24 +24,30 @@ using MetaObj::MetaStruct;
 bool IsPresent(const MetaObjectPtr& value);
 
 // Typed views of a value; null when it is of another kind.
-const MetaStruct* AsRecord(const MetaObjectPtr& value);
-const MetaList* AsList(const MetaObjectPtr& value);
+const MetaStruct* AsRecord(const MetaObject* value);
+const MetaList* AsList(const MetaObject* value);
+inline const MetaStruct* AsRecord(const MetaObjectPtr& value) { return AsRecord(value.get()); }
+inline const MetaList* AsList(const MetaObjectPtr& value) { return AsList(value.get()); }
 bool IsRecordList(const MetaObjectPtr& value);
 
 // "abc", "42", "true": the text of a string, int or bool.
 std::string ScalarText(const MetaObject& value);
+// The same, appended to `out`.
+void AppendScalarText(std::string& out, const MetaObject& value);
 
-// The elements of a list that are present, in order.
-std::vector<MetaObjectPtr> PresentElements(const MetaList& list);
+// The elements of a list that are present, in order. The pointers are valid
+// as long as the list is.
+std::vector<const MetaObject*> PresentElements(const MetaList& list);
 
 // The present fields of a record in display order. With the record type's
 // "fields:" hint, the hinted fields the record has come first, in hint order;
 // HintedOnly stops there (the human formats), HintedFirst then adds the
 // record's other fields in record order (the machine formats). A hint that
-// matches none of the record's fields is ignored.
+// matches none of the record's fields is ignored. The pointers are valid as
+// long as the record is.
 enum class FieldSelection { HintedOnly, HintedFirst };
-std::vector<MetaStruct::Field> SelectFields(const MetaStruct& record, const FormatHints& hints,
-                                            FieldSelection selection);
+std::vector<const MetaStruct::Field*> SelectFields(const MetaStruct& record, const FormatHints& hints,
+                                                   FieldSelection selection);
 
 // How a value reads inside one line or one table cell.
 struct InlineStyle {
@@ -54,6 +60,9 @@ struct InlineStyle {
 // of records as such items joined by ", ".
 std::string InlineText(const MetaObjectPtr& value, const std::string& type, const std::string& field,
                        const FormatHints& hints, const InlineStyle& style);
+// The same, appended to `out`.
+void AppendInlineText(std::string& out, const MetaObject& value, const std::string& type, const std::string& field,
+                      const FormatHints& hints, const InlineStyle& style);
 
 // A result laid out as columns and rows of cell text, for table and csv.
 struct Table {

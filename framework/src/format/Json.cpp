@@ -34,15 +34,15 @@ public:
     JsonWriter(const FormatHints& hints, std::ostream& out) : hints_(hints), out_(out) {}
 
     void Value(const MetaObject& value, std::size_t depth) {
-        if (const auto* record = dynamic_cast<const MetaStruct*>(&value)) {
+        if (const MetaStruct* record = AsRecord(&value)) {
             Block('{', '}', SelectFields(*record, hints_, FieldSelection::HintedFirst), depth,
-                  [&](const MetaStruct::Field& field) {
-                      out_ << Quote(field.first) << ": ";
-                      Value(*field.second, depth + 1);
+                  [&](const MetaStruct::Field* field) {
+                      out_ << Quote(field->first) << ": ";
+                      Value(*field->second, depth + 1);
                   });
-        } else if (const auto* list = dynamic_cast<const MetaList*>(&value)) {
+        } else if (const MetaList* list = AsList(&value)) {
             Block('[', ']', PresentElements(*list), depth,
-                  [&](const MetaObjectPtr& element) { Value(*element, depth + 1); });
+                  [&](const MetaObject* element) { Value(*element, depth + 1); });
         } else if (value.GetType() == MetaObj::META_STRING) {
             out_ << Quote(ScalarText(value));
         } else {
