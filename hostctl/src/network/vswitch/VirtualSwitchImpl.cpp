@@ -172,8 +172,8 @@ std::vector<std::string> VirtualSwitchImpl::GetBeaconRequiredBy() const {
     const bool switchProbes = IsBeaconEnabled();
     std::vector<std::string> names;
     for (const auto& portGroup : PortGroupRecords()) {
-        // The port group's own failure detection, if it sets one, else its
-        // switch's (the policy in force, as InForce in PortGroupImpl.cpp).
+        // The detection in force: the port group's own if it sets one, else
+        // its switch's.
         const NicTeamingPolicy own = Detail::OwnPolicy<NicTeamingPolicy>(*portGroup);
         const bool probes = own.IsLinkCriteriaSet() ? own.GetLinkCriteria().IsBeaconChecking() : switchProbes;
         if (probes) names.push_back(portGroup->name);
