@@ -1,18 +1,15 @@
 #include "hostctl/network/NetworkInfoImpl.h"
 
-#include <unordered_map>
-
 #include "Operation.h"
 #include "hostctl/network/nic/PnicImpl.h"
 #include "hostctl/network/vswitch/SwitchImpl.h"
 #include "network/NetworkRecords.h"
 #include "network/nic/NicRecords.h"
-#include "network/vswitch/VswitchRecords.h"
+#include "network/vswitch/VswitchLookup.h"
 
 namespace PldCtl {
 namespace Network {
 
-using Detail::PortGroupRecord;
 using Detail::PortRecord;
 using Detail::SystemRecord;
 
@@ -52,10 +49,7 @@ std::vector<std::unique_ptr<HostCtl::Network::PortGroup>> NetworkInfoImpl::GetAl
         const auto active = t.CountGroups(PortRecord::kSection, PortRecord::kPortGroupField,
                                           {Store::FieldTest{PortRecord::kClientField, std::nullopt}});
         // Switch by switch, each switch's port groups in their order.
-        std::unordered_map<std::string, std::vector<std::shared_ptr<const PortGroupRecord>>> bySwitch;
-        for (auto& portGroup : Detail::DecodeShared<PortGroupRecord>(t.ListText(PortGroupRecord::kSection))) {
-            bySwitch[portGroup->vswitch].push_back(std::move(portGroup));
-        }
+        Detail::PortGroupsBySwitch bySwitch = Detail::ListPortGroupsBySwitch(t);
         for (const std::string& vswitch : t.ListKeys(Detail::VswitchRecord::kSection)) {
             auto own = bySwitch.find(vswitch);
             if (own == bySwitch.end()) continue;

@@ -1,6 +1,4 @@
 // The host's standard switches: listing, finding, adding and removing them.
-#include <unordered_map>
-
 #include "hostctl/Lib.h"
 #include "hostctl/network/vswitch/SwitchImpl.h"
 #include "hostctl/network/vswitch/VswitchTables.h"
@@ -34,11 +32,7 @@ std::vector<std::unique_ptr<VirtualSwitch>> VirtualSwitchInfoImpl::GetVirtualSwi
     store.Read([&](Transaction& t) {
         const auto ports =
             t.CountGroups(PortRecord::kSection, std::string(), {FieldTest{PortRecord::kClientField, std::nullopt}});
-        // In the host's order, so each switch's port groups are in its order.
-        std::unordered_map<std::string, std::vector<std::shared_ptr<const PortGroupRecord>>> portGroups;
-        for (auto& portGroup : Detail::DecodeShared<PortGroupRecord>(t.ListText(PortGroupRecord::kSection))) {
-            portGroups[portGroup->vswitch].push_back(std::move(portGroup));
-        }
+        Detail::PortGroupsBySwitch portGroups = Detail::ListPortGroupsBySwitch(t);
         for (auto& vswitch : Detail::DecodeShared<VswitchRecord>(t.ListText(VswitchRecord::kSection))) {
             auto counted = ports.find(vswitch->name);
             const std::pair<int, int> portCounts =

@@ -61,6 +61,14 @@ void CheckPortGroupName(const std::string& name) {
     }
 }
 
+PortGroupsBySwitch ListPortGroupsBySwitch(Store::Transaction& t) {
+    PortGroupsBySwitch bySwitch;
+    for (auto& portGroup : DecodeShared<PortGroupRecord>(t.ListText(PortGroupRecord::kSection))) {
+        bySwitch[portGroup->vswitch].push_back(std::move(portGroup));
+    }
+    return bySwitch;
+}
+
 void ReleaseNic(Store::Transaction& t, const std::string& nic) {
     if (std::optional<StoredObject<NicRecord>> stored = Find<NicRecord>(t, nic)) {
         NicRecord released = stored->record;

@@ -6,6 +6,8 @@
 
 #include <memory>
 #include <string>
+#include <unordered_map>
+#include <vector>
 
 #include "Operation.h"
 #include "network/vswitch/VswitchRecords.h"
@@ -32,6 +34,11 @@ std::string ClientsOf(Store::Transaction& t, const std::string& vswitch, Keep ke
     }
     return clients;
 }
+
+// Every port group of the host by the name of its switch, each switch's in
+// their order: one pass over the collection for a listing of all switches.
+using PortGroupsBySwitch = std::unordered_map<std::string, std::vector<std::shared_ptr<const PortGroupRecord>>>;
+PortGroupsBySwitch ListPortGroupsBySwitch(Store::Transaction& t);
 
 // Marks a NIC as no longer the uplink of any switch (a NIC the host does not
 // have is left alone).
