@@ -32,8 +32,8 @@ public:
         } else if (const MetaList* list = AsList(&result)) {
             std::vector<const MetaObject*> elements = PresentElements(*list);
             for (std::size_t i = 0; i < elements.size(); ++i) {
-                const MetaStruct* record = AsRecord(elements[i]);
-                Value(Indexed(record ? record->GetTypeName() : "", i), *elements[i]);
+                const MetaStruct* element = AsRecord(elements[i]);
+                Value(Indexed(element ? element->GetTypeName() : "", i), *elements[i]);
             }
         } else {
             Value("value", result);
