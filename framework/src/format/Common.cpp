@@ -74,7 +74,9 @@ std::vector<std::string> ChooseColumns(const std::vector<const MetaStruct*>& rec
 
 }  // namespace
 
-bool IsPresent(const MetaObjectPtr& value) { return value && value->HasValue(); }
+bool IsPresent(const MetaObjectPtr& value) {
+    return value && value->HasValue();
+}
 
 // Records and lists are made only by their own New(), so the type tag tells
 // what a value is.
@@ -93,10 +95,17 @@ bool IsRecordList(const MetaObjectPtr& value) {
 
 void AppendScalarText(std::string& out, const MetaObject& value) {
     switch (value.GetType()) {
-    case MetaObj::META_STRING: out += static_cast<const MetaObj::MetaString&>(value).GetValue(); break;
-    case MetaObj::META_INT: out += static_cast<const MetaObj::MetaInt&>(value).ToString(); break;
-    case MetaObj::META_BOOL: out += static_cast<const MetaObj::MetaBool&>(value).GetValue() ? "true" : "false"; break;
-    default: break;
+        case MetaObj::META_STRING:
+            out += static_cast<const MetaObj::MetaString&>(value).GetValue();
+            break;
+        case MetaObj::META_INT:
+            out += static_cast<const MetaObj::MetaInt&>(value).ToString();
+            break;
+        case MetaObj::META_BOOL:
+            out += static_cast<const MetaObj::MetaBool&>(value).GetValue() ? "true" : "false";
+            break;
+        default:
+            break;
     }
 }
 

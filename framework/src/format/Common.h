@@ -26,8 +26,12 @@ bool IsPresent(const MetaObjectPtr& value);
 // Typed views of a value; null when it is of another kind.
 const MetaStruct* AsRecord(const MetaObject* value);
 const MetaList* AsList(const MetaObject* value);
-inline const MetaStruct* AsRecord(const MetaObjectPtr& value) { return AsRecord(value.get()); }
-inline const MetaList* AsList(const MetaObjectPtr& value) { return AsList(value.get()); }
+inline const MetaStruct* AsRecord(const MetaObjectPtr& value) {
+    return AsRecord(value.get());
+}
+inline const MetaList* AsList(const MetaObjectPtr& value) {
+    return AsList(value.get());
+}
 bool IsRecordList(const MetaObjectPtr& value);
 
 // "abc", "42", "true": the text of a string, int or bool.
@@ -79,7 +83,9 @@ bool BuildTable(const MetaObject& result, const FormatHints& hints, const Inline
 // overlong, a surrogate, above U+10FFFF) decodes as U+FFFD and takes one byte.
 std::size_t DecodeUtf8(const std::string& text, std::size_t pos, char32_t& codePoint);
 // True when DecodeUtf8 stood in for a bad byte rather than read a real U+FFFD.
-inline bool IsBadByte(char32_t codePoint, std::size_t length) { return codePoint == 0xFFFD && length == 1; }
+inline bool IsBadByte(char32_t codePoint, std::size_t length) {
+    return codePoint == 0xFFFD && length == 1;
+}
 
 // Rewrites a text character by character. `replace` is called with each
 // character (a bad byte as U+FFFD, with badByte set) and returns the text to

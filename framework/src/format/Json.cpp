@@ -12,21 +12,31 @@ namespace {
 // A JSON string literal. Control characters and bytes that are not UTF-8
 // become escapes; every other character passes through as it is.
 std::string Quote(const std::string& text) {
-    return '"' + Recode(text, [](char32_t c, bool badByte) -> std::optional<std::string> {
-        switch (c) {
-        case '"': return "\\\"";
-        case '\\': return "\\\\";
-        case '\b': return "\\b";
-        case '\f': return "\\f";
-        case '\n': return "\\n";
-        case '\r': return "\\r";
-        case '\t': return "\\t";
-        }
-        if (c >= 0x20 && !badByte) return std::nullopt;
-        char escape[8];
-        std::snprintf(escape, sizeof escape, "\\u%04x", static_cast<unsigned>(c));
-        return std::string(escape);
-    }) + '"';
+    return '"' +
+           Recode(text,
+                  [](char32_t c, bool badByte) -> std::optional<std::string> {
+                      switch (c) {
+                          case '"':
+                              return "\\\"";
+                          case '\\':
+                              return "\\\\";
+                          case '\b':
+                              return "\\b";
+                          case '\f':
+                              return "\\f";
+                          case '\n':
+                              return "\\n";
+                          case '\r':
+                              return "\\r";
+                          case '\t':
+                              return "\\t";
+                      }
+                      if (c >= 0x20 && !badByte) return std::nullopt;
+                      char escape[8];
+                      std::snprintf(escape, sizeof escape, "\\u%04x", static_cast<unsigned>(c));
+                      return std::string(escape);
+                  }) +
+           '"';
 }
 
 class JsonWriter {

@@ -14,16 +14,25 @@ namespace {
 std::string Escape(const std::string& text, bool attribute) {
     return Recode(text, [attribute](char32_t c, bool badByte) -> std::optional<std::string> {
         switch (c) {
-        case '&': return "&amp;";
-        case '<': return "&lt;";
-        case '>': return "&gt;";
-        case '"': return "&quot;";
-        case '\'': return "&apos;";
-        case '\r': return "&#13;";
-        case '\t': return attribute ? "&#9;" : "\t";
-        case '\n': return attribute ? "&#10;" : "\n";
-        case 0xFFFE:
-        case 0xFFFF: return "";
+            case '&':
+                return "&amp;";
+            case '<':
+                return "&lt;";
+            case '>':
+                return "&gt;";
+            case '"':
+                return "&quot;";
+            case '\'':
+                return "&apos;";
+            case '\r':
+                return "&#13;";
+            case '\t':
+                return attribute ? "&#9;" : "\t";
+            case '\n':
+                return attribute ? "&#10;" : "\n";
+            case 0xFFFE:
+            case 0xFFFF:
+                return "";
         }
         if (badByte) return "\xEF\xBF\xBD";
         if (c < 0x20) return "";
@@ -38,7 +47,7 @@ bool IsInline(const MetaObject& value) {
 }
 
 std::string Scalar(const MetaObject& value) {
-    const char* tag = value.GetType() == MetaObj::META_INT ? "integer"
+    const char* tag = value.GetType() == MetaObj::META_INT    ? "integer"
                       : value.GetType() == MetaObj::META_BOOL ? "boolean"
                                                               : "string";
     return std::string("<") + tag + ">" + Escape(ScalarText(value), false) + "</" + tag + ">";
@@ -66,8 +75,8 @@ public:
                     [&](const MetaStruct::Field* field) { Field(*field, depth + 1); });
         } else if (const MetaList* list = AsList(&value)) {
             bool records = list->GetElementType() == MetaObj::META_STRUCT;
-            Element(depth, records ? "<list type=\"structure\">" : kStringListOpen, "</list>",
-                    PresentElements(*list), [&](const MetaObject* element) { Value(*element, depth + 1); });
+            Element(depth, records ? "<list type=\"structure\">" : kStringListOpen, "</list>", PresentElements(*list),
+                    [&](const MetaObject* element) { Value(*element, depth + 1); });
         } else {
             Line(depth, Scalar(value));
         }
