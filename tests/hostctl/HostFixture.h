@@ -8,10 +8,17 @@
 #include <string>
 
 #include "hostctl/Lib.h"
+#include "hostctl/network/NetworkFactory.h"
+#include "hostctl/network/vswitch/Policy.h"
 #include "support/store_test_util.h"
 
 class FreshHost : public ::testing::Test {
 protected:
+    using NetworkFactory = HostCtl::Network::NetworkFactory;
+    using NicTeamingPolicy = HostCtl::Network::NicTeamingPolicy;
+    using PortSecurityPolicy = HostCtl::Network::PortSecurityPolicy;
+    using ShapingPolicy = HostCtl::Network::ShapingPolicy;
+
     FreshHost() : db_("ORVIX_HOST_DB", dir_ / "host.db"), profile_("ORVIX_HOST_PROFILE", std::nullopt) {
         PldCtl::Store::HostStore::ResetDefault();
     }

@@ -10,7 +10,6 @@
 namespace PldCtl {
 namespace Network {
 
-using Detail::PortRecord;
 using Detail::SystemRecord;
 
 NetworkInfoImpl::NetworkInfoImpl() = default;

@@ -4,16 +4,11 @@
 #include <gtest/gtest.h>
 
 #include "hostctl/HostFixture.h"
-#include "hostctl/network/NetworkFactory.h"
 #include "hostctl/network/vswitch/SwitchImpl.h"
 
 namespace {
 
 using HostCtl::Lib::HostCtlException;
-using HostCtl::Network::NetworkFactory;
-using HostCtl::Network::NicTeamingPolicy;
-using HostCtl::Network::PortSecurityPolicy;
-using HostCtl::Network::ShapingPolicy;
 using PldCtl::Store::HostStore;
 
 class Switches : public FreshHost {

@@ -17,16 +17,7 @@
 namespace PldCtl {
 namespace Network {
 
-using Detail::PortGroupRecord;
-using Detail::PortRecord;
-using Detail::VswitchRecord;
-using HostCtl::Lib::HostCtlException;
-using HostCtl::Network::NicTeamingPolicy;
 using HostCtl::Network::PortGroup;
-using HostCtl::Network::PortSecurityPolicy;
-using HostCtl::Network::ShapingPolicy;
-using Store::FieldTest;
-using Store::Transaction;
 
 namespace {
 

@@ -9,16 +9,7 @@
 namespace PldCtl {
 namespace Network {
 
-using Detail::PortGroupRecord;
-using Detail::PortRecord;
-using Detail::VswitchRecord;
-using HostCtl::Lib::HostCtlException;
-using HostCtl::Network::NicTeamingPolicy;
-using HostCtl::Network::PortSecurityPolicy;
-using HostCtl::Network::ShapingPolicy;
 using HostCtl::Network::VirtualSwitch;
-using Store::FieldTest;
-using Store::Transaction;
 
 VirtualSwitchInfoImpl::VirtualSwitchInfoImpl() = default;
 

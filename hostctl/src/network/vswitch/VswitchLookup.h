@@ -10,6 +10,7 @@
 #include <vector>
 
 #include "Operation.h"
+#include "hostctl/Lib.h"
 #include "network/vswitch/VswitchRecords.h"
 
 namespace PldCtl {
@@ -62,4 +63,19 @@ std::shared_ptr<const Record> ChangeStored(const char* operation, const std::str
 }
 
 }  // namespace Detail
+
+namespace Network {
+
+// The names the room's classes use throughout.
+using Detail::PortGroupRecord;
+using Detail::PortRecord;
+using Detail::VswitchRecord;
+using HostCtl::Lib::HostCtlException;
+using HostCtl::Network::NicTeamingPolicy;
+using HostCtl::Network::PortSecurityPolicy;
+using HostCtl::Network::ShapingPolicy;
+using Store::FieldTest;
+using Store::Transaction;
+
+}  // namespace Network
 }  // namespace PldCtl
