@@ -15,14 +15,6 @@ void AddUnique(std::vector<std::string>& names, const std::string& name) {
     if (!Contains(names, name)) names.push_back(name);
 }
 
-// Whether any hint gives a unit. Most commands set none, and then a value
-// needs no lookup of its unit.
-bool HasUnitHints(const FormatHints& hints) {
-    static const std::string kUnitsPrefix = "units:";
-    auto first = hints.Raw().lower_bound(kUnitsPrefix);
-    return first != hints.Raw().end() && first->first.compare(0, kUnitsPrefix.size(), kUnitsPrefix) == 0;
-}
-
 void AppendRecordInline(std::string& out, const MetaStruct& record, const FormatHints& hints,
                         const InlineStyle& style) {
     out += '{';
@@ -186,13 +178,20 @@ void AppendInlineText(std::string& out, const MetaObject& value, const std::stri
         return;
     }
     AppendScalarText(out, value);
-    if (style.units && HasUnitHints(hints)) {
+    if (style.units) {
         std::string unit = hints.Unit(type, field);
         if (!unit.empty()) {
             out += ' ';
             out += unit;
         }
     }
+}
+
+InlineStyle ForHints(const InlineStyle& style, const FormatHints& hints) {
+    static const std::string kUnitsPrefix = "units:";
+    auto first = hints.Raw().lower_bound(kUnitsPrefix);
+    const bool anyUnit = first != hints.Raw().end() && first->first.compare(0, kUnitsPrefix.size(), kUnitsPrefix) == 0;
+    return InlineStyle{style.listSeparator, style.units && anyUnit};
 }
 
 std::string InlineText(const MetaObjectPtr& value, const std::string& type, const std::string& field,

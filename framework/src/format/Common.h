@@ -59,6 +59,10 @@ struct InlineStyle {
     bool units;                 // a scalar is followed by its unit word, if any
 };
 
+// The style with units turned off when no hint gives any, so that values
+// need no lookup of their unit: most commands set none.
+InlineStyle ForHints(const InlineStyle& style, const FormatHints& hints);
+
 // The one-line text of a field's value: a scalar (with its unit when the
 // style asks), a string list joined, a record as "{Name: value, ...}", a list
 // of records as such items joined by ", ".

@@ -16,7 +16,8 @@ const std::size_t kFlushSize = 32 * 1024;
 // small pieces.
 class SimpleWriter {
 public:
-    SimpleWriter(const FormatHints& hints, std::ostream& out) : hints_(hints), out_(out) {}
+    SimpleWriter(const FormatHints& hints, std::ostream& out)
+        : hints_(hints), style_(ForHints(kSimpleStyle, hints)), out_(out) {}
 
     void Result(const MetaObject& result) {
         if (const MetaStruct* record = AsRecord(&result)) {
@@ -85,7 +86,7 @@ private:
             RecordList(*AsList(field.second), indent + kIndentStep, indent + kIndentStep);
         } else {
             text_ += ' ';
-            AppendInlineText(text_, *field.second, type, field.first, hints_, kSimpleStyle);
+            AppendInlineText(text_, *field.second, type, field.first, hints_, style_);
             text_ += '\n';
         }
     }
@@ -103,7 +104,7 @@ private:
             text_.append(header, pos, open - pos);
             if (value && IsPresent(*value)) {
                 AppendInlineText(text_, **value, record.GetTypeName(), header.substr(open + 1, close - open - 1),
-                                 hints_, kSimpleStyle);
+                                 hints_, style_);
                 pos = close + 1;
             } else {
                 text_ += '%';
@@ -123,6 +124,7 @@ private:
     }
 
     const FormatHints& hints_;
+    const InlineStyle style_;
     std::ostream& out_;
     std::string text_;
 };

@@ -31,7 +31,7 @@ void AppendRow(std::string& text, const std::vector<std::string>& cells, const s
 
 void WriteTable(const MetaObject& result, const FormatHints& hints, std::ostream& out) {
     Table table;
-    if (!BuildTable(result, hints, kTableStyle, table)) {
+    if (!BuildTable(result, hints, ForHints(kTableStyle, hints), table)) {
         WriteSimple(result, hints, out);
         return;
     }
