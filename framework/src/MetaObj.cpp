@@ -3,7 +3,15 @@
 #include <limits>
 #include <stdexcept>
 
+#include <boost/make_shared.hpp>
+
 namespace MetaObj {
+
+namespace {
+
+constexpr std::size_t kTypicalFieldCount = 8;
+
+}  // namespace
 
 const char* MetaTypeName(int type) {
     switch (type) {
@@ -24,29 +32,29 @@ const char* MetaTypeName(int type) {
 MetaObject::~MetaObject() = default;
 
 boost::shared_ptr<MetaString> MetaString::New() {
-    return boost::shared_ptr<MetaString>(new MetaString());
+    return boost::make_shared<MetaString>(Token());
 }
 
 boost::shared_ptr<MetaString> MetaString::New(const std::string& value) {
-    boost::shared_ptr<MetaString> s(new MetaString());
+    boost::shared_ptr<MetaString> s = boost::make_shared<MetaString>(Token());
     s->value_ = value;
     s->hasValue_ = true;
     return s;
 }
 
 boost::shared_ptr<MetaInt> MetaInt::New() {
-    return boost::shared_ptr<MetaInt>(new MetaInt());
+    return boost::make_shared<MetaInt>(Token());
 }
 
 boost::shared_ptr<MetaInt> MetaInt::New(std::int64_t value) {
-    boost::shared_ptr<MetaInt> i(new MetaInt());
+    boost::shared_ptr<MetaInt> i = boost::make_shared<MetaInt>(Token());
     i->bits_ = static_cast<std::uint64_t>(value);
     i->hasValue_ = true;
     return i;
 }
 
 boost::shared_ptr<MetaInt> MetaInt::NewUnsigned(std::uint64_t value) {
-    boost::shared_ptr<MetaInt> i(new MetaInt());
+    boost::shared_ptr<MetaInt> i = boost::make_shared<MetaInt>(Token());
     i->bits_ = value;
     i->isUnsigned_ = value > static_cast<std::uint64_t>(std::numeric_limits<std::int64_t>::max());
     i->hasValue_ = true;
@@ -58,18 +66,18 @@ std::string MetaInt::ToString() const {
 }
 
 boost::shared_ptr<MetaBool> MetaBool::New() {
-    return boost::shared_ptr<MetaBool>(new MetaBool());
+    return boost::make_shared<MetaBool>(Token());
 }
 
 boost::shared_ptr<MetaBool> MetaBool::New(bool value) {
-    boost::shared_ptr<MetaBool> b(new MetaBool());
+    boost::shared_ptr<MetaBool> b = boost::make_shared<MetaBool>(Token());
     b->value_ = value;
     b->hasValue_ = true;
     return b;
 }
 
 boost::shared_ptr<MetaStruct> MetaStruct::New(const std::string& typeName) {
-    return boost::shared_ptr<MetaStruct>(new MetaStruct(typeName));
+    return boost::make_shared<MetaStruct>(Token(), typeName);
 }
 
 void MetaStruct::SetField(const std::string& name, const MetaObjectPtr& value) {
@@ -82,6 +90,9 @@ void MetaStruct::SetField(const std::string& name, const MetaObjectPtr& value) {
             return;
         }
     }
+    // Room for a typical record at once, instead of growing one field at a
+    // time: listings make thousands of records.
+    if (fields_.empty()) fields_.reserve(kTypicalFieldCount);
     fields_.emplace_back(name, value);
 }
 
@@ -130,7 +141,7 @@ boost::shared_ptr<MetaList> MetaList::New(int elementType, const MetaObjectPtr& 
         throw std::invalid_argument("MetaList::New: a list holds strings (2) or records (3), not type " +
                                     std::to_string(elementType));
     }
-    return boost::shared_ptr<MetaList>(new MetaList(elementType, elementTemplate));
+    return boost::make_shared<MetaList>(Token(), elementType, elementTemplate);
 }
 
 void MetaList::Append(const boost::shared_ptr<MetaString>& element) {

@@ -2,6 +2,7 @@
 // table to new stores; docs/host-profile.md describes the objects' fields.
 #include <stdexcept>
 
+#include "hoststore/CollectionNames.h"
 #include "hoststore/HostStore.h"
 
 namespace PldCtl {
@@ -10,34 +11,34 @@ namespace Store {
 const std::vector<CollectionInfo>& Collections() {
     static const std::vector<CollectionInfo> collections = {
         // Physical NICs with their driver data, offloads, SR-IOV functions.
-        {"nics", {"name"}, nullptr, nullptr},
+        {Section::kNics, {"name"}, nullptr, nullptr},
         // Standard switches with their uplinks and policies.
-        {"vswitches", {"name"}, nullptr, nullptr, {"numPorts"}},
+        {Section::kVswitches, {"name"}, nullptr, nullptr, {"numPorts"}},
         // Port groups of standard switches, each with its own policies.
-        {"portgroups", {"name"}, "vswitch", "vswitches"},
+        {Section::kPortGroups, {"name"}, "vswitch", Section::kVswitches},
         // Distributed switches with their uplinks and LACP data.
-        {"dvswitches", {"name"}, nullptr, nullptr, {"numPorts"}},
-        {"dvports", {"dvswitch", "id"}, "dvswitch", "dvswitches"},
+        {Section::kDvSwitches, {"name"}, nullptr, nullptr, {"numPorts"}},
+        {Section::kDvPorts, {"dvswitch", "id"}, "dvswitch", Section::kDvSwitches},
         // Network stack instances with their DNS and gateway settings.
-        {"netstacks", {"key"}, nullptr, nullptr},
+        {Section::kNetstacks, {"key"}, nullptr, nullptr},
         // Kernel IP interfaces (pld0 ...).
-        {"interfaces", {"name"}, "netstack", "netstacks"},
-        {"routes", {"netstack", "network", "gateway"}, "netstack", "netstacks"},
-        {"neighbors", {"netstack", "interface", "address"}, "netstack", "netstacks"},
-        {"connections",
+        {Section::kInterfaces, {"name"}, "netstack", Section::kNetstacks},
+        {Section::kRoutes, {"netstack", "network", "gateway"}, "netstack", Section::kNetstacks},
+        {Section::kNeighbors, {"netstack", "interface", "address"}, "netstack", Section::kNetstacks},
+        {Section::kConnections,
          {"netstack", "proto", "localAddress", "localPort", "foreignAddress", "foreignPort"},
          "netstack",
-         "netstacks"},
+         Section::kNetstacks},
         // Running worlds (virtual machines and host processes).
-        {"worlds", {"id"}, nullptr, nullptr},
+        {Section::kWorlds, {"id"}, nullptr, nullptr},
         // Virtual ports of standard and distributed switches; the owner is the
         // port set (either kind), so it is not checked against one section.
-        {"ports", {"id"}, "portset", nullptr, {"client", "portgroup", "type"}},
-        {"firewallRulesets", {"name"}, nullptr, nullptr},
-        {"ipsecSAs", {"name"}, nullptr, nullptr},
-        {"ipsecSPs", {"name"}, nullptr, nullptr},
+        {Section::kPorts, {"id"}, "portset", nullptr, {"client", "portgroup", "type"}},
+        {Section::kFirewallRulesets, {"name"}, nullptr, nullptr},
+        {Section::kIpsecSAs, {"name"}, nullptr, nullptr},
+        {Section::kIpsecSPs, {"name"}, nullptr, nullptr},
         // Commands the host was asked to run (init scripts), in order.
-        {"execLog", {}, nullptr, nullptr},
+        {Section::kExecLog, {}, nullptr, nullptr},
     };
     return collections;
 }
@@ -57,7 +58,7 @@ const CollectionInfo& Collection(const std::string& section) {
 }
 
 const std::vector<std::string>& Singletons() {
-    static const std::vector<std::string> singletons = {"system", "firewall", "ipsec"};
+    static const std::vector<std::string> singletons = {Section::kSystem, Section::kFirewall, Section::kIpsec};
     return singletons;
 }
 

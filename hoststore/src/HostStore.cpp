@@ -139,6 +139,30 @@ std::int64_t HostStore::CountChildren(const std::string& section, const std::str
     return Transaction(*this).CountChildren(section, parent, tests);
 }
 
+// ---- Stored text -----------------------------------------------------------
+
+std::optional<std::string> HostStore::GetText(const std::string& section, const std::string& key) {
+    return Transaction(*this).GetText(section, key);
+}
+
+std::vector<std::string> HostStore::ListText(const std::string& section) {
+    return Transaction(*this).ListText(section);
+}
+
+std::vector<std::string> HostStore::ListChildrenText(const std::string& section, const std::string& parent) {
+    return Transaction(*this).ListChildrenText(section, parent);
+}
+
+std::string HostStore::GetSingletonText(const std::string& name) {
+    return Transaction(*this).GetSingletonText(name);
+}
+
+StoreError HostStore::DamagedObjectError() const {
+    return StoreError(Sql::Describe(path_, "holds an object that is not JSON; it is damaged"));
+}
+
+// ---- end of stored text -----------------------------------------------------
+
 Json HostStore::Dump() {
     Json profile = {{"format", kProfileFormat}, {"version", kProfileVersion}};
     Read([&](Transaction& transaction) {

@@ -215,5 +215,92 @@ void Transaction::PutSingleton(const std::string& name, const Json& object) {
         .Run();
 }
 
+// ---- Stored text -----------------------------------------------------------
+// The reads above without the parsing: the same statements, each row's
+// document handed out as text.
+
+namespace {
+
+std::vector<std::string> Texts(Sql::Query& query) {
+    std::vector<std::string> texts;
+    while (query.Next()) texts.push_back(query.Text(0));
+    return texts;
+}
+
+}  // namespace
+
+std::optional<std::string> Transaction::GetText(const std::string& section, const std::string& key) {
+    auto query = Statement(store_.impl_->db, section, "SELECT doc FROM %T WHERE key = ?1");
+    query.Bind(1, key);
+    if (!query.Next()) return std::nullopt;
+    return query.Text(0);
+}
+
+std::vector<std::string> Transaction::ListText(const std::string& section) {
+    auto query = Statement(store_.impl_->db, section, "SELECT doc FROM %T ORDER BY seq");
+    return Texts(query);
+}
+
+std::vector<std::string> Transaction::ListChildrenText(const std::string& section, const std::string& parent) {
+    auto query = Statement(store_.impl_->db, section, "SELECT doc FROM %T WHERE parent = ?1 ORDER BY seq");
+    query.Bind(1, parent);
+    return Texts(query);
+}
+
+std::vector<std::string> Transaction::ListByParentOrderText(const std::string& section) {
+    const CollectionInfo& collection = Collection(section);
+    if (!collection.parentSection) {
+        throw std::invalid_argument(section + ": its objects have no parent section to be ordered by");
+    }
+    const std::string sql = "SELECT c.doc FROM %T AS c JOIN " + Sql::Quote(collection.parentSection) +
+                            " AS p ON p.key = c.parent ORDER BY p.seq, c.seq";
+    auto query = store_.impl_->db.Prepare(TableSql(section, sql.c_str()));
+    return Texts(query);
+}
+
+std::string Transaction::GetSingletonText(const std::string& name) {
+    RequireSingleton(name);
+    auto query = store_.impl_->db.Prepare("SELECT doc FROM singleton WHERE name = ?1");
+    return query.Bind(1, name).Next() ? query.Text(0) : std::string("{}");
+}
+
+std::vector<std::string> Transaction::ListKeys(const std::string& section) {
+    auto query = Statement(store_.impl_->db, section, "SELECT key FROM %T ORDER BY seq");
+    return Texts(query);
+}
+
+std::unordered_map<std::string, Transaction::GroupCount> Transaction::CountGroups(const std::string& section,
+                                                                                  const std::string& byField,
+                                                                                  const std::vector<FieldTest>& tests) {
+    const CollectionInfo& collection = Collection(section);
+    // The tests as one condition: Conditions() gives " WHERE a AND b" and
+    // binds its values from ?1 on.
+    std::vector<std::string> bindings;
+    const std::string where = Conditions(collection, tests, false, bindings);
+    const std::string kWhere = " WHERE ";
+    const std::string passes = where.empty() ? "1" : "(" + where.substr(kWhere.size()) + ")";
+    std::string group = "parent";
+    if (!byField.empty()) {
+        group = ColumnOf(collection, byField);
+        if (group.empty()) {
+            bindings.push_back("$.\"" + byField + "\"");
+            group = "json_extract(doc, ?" + std::to_string(bindings.size()) + ")";
+        }
+        group = "CAST(" + group + " AS TEXT)";
+    }
+    auto query = Statement(store_.impl_->db, section, ("SELECT " + group + ", " + passes + " FROM %T").c_str());
+    for (std::size_t i = 0; i < bindings.size(); ++i) query.Bind(static_cast<int>(i + 1), bindings[i]);
+    std::unordered_map<std::string, GroupCount> counts;
+    while (query.Next()) {
+        if (query.IsNull(0)) continue;
+        GroupCount& count = counts[query.Text(0)];
+        ++count.all;
+        if (query.Int(1) != 0) ++count.passing;
+    }
+    return counts;
+}
+
+// ---- end of stored text -----------------------------------------------------
+
 }  // namespace Store
 }  // namespace PldCtl

@@ -35,6 +35,13 @@ public:
     virtual bool HasValue() const { return true; }
 
 protected:
+    // Only the classes' own New() can make the token their constructors
+    // take; the constructors are public for boost::make_shared alone, which
+    // puts a value and its reference count in one allocation.
+    struct Token {
+        explicit Token() = default;
+    };
+
     MetaObject() = default;
     MetaObject(const MetaObject&) = delete;
     MetaObject& operator=(const MetaObject&) = delete;
@@ -44,6 +51,7 @@ using MetaObjectPtr = boost::shared_ptr<MetaObject>;
 
 class MetaString : public MetaObject {
 public:
+    explicit MetaString(Token) {}
     static boost::shared_ptr<MetaString> New();
     static boost::shared_ptr<MetaString> New(const std::string& value);
 
@@ -52,7 +60,6 @@ public:
     const std::string& GetValue() const { return value_; }
 
 private:
-    MetaString() = default;
     std::string value_;
     bool hasValue_ = false;
 };
@@ -61,6 +68,7 @@ private:
 // unsigned so that they print exactly instead of wrapping to negatives.
 class MetaInt : public MetaObject {
 public:
+    explicit MetaInt(Token) {}
     static boost::shared_ptr<MetaInt> New();
     static boost::shared_ptr<MetaInt> New(std::int64_t value);
     static boost::shared_ptr<MetaInt> NewUnsigned(std::uint64_t value);
@@ -73,7 +81,6 @@ public:
     std::string ToString() const;
 
 private:
-    MetaInt() = default;
     std::uint64_t bits_ = 0;
     bool isUnsigned_ = false;
     bool hasValue_ = false;
@@ -81,6 +88,7 @@ private:
 
 class MetaBool : public MetaObject {
 public:
+    explicit MetaBool(Token) {}
     static boost::shared_ptr<MetaBool> New();
     static boost::shared_ptr<MetaBool> New(bool value);
 
@@ -89,7 +97,6 @@ public:
     bool GetValue() const { return value_; }
 
 private:
-    MetaBool() = default;
     bool value_ = false;
     bool hasValue_ = false;
 };
@@ -101,6 +108,7 @@ public:
     using Field = std::pair<std::string, MetaObjectPtr>;
 
     static boost::shared_ptr<MetaStruct> New(const std::string& typeName);
+    MetaStruct(Token, const std::string& typeName) : typeName_(typeName) {}
 
     MetaType GetType() const override { return META_STRUCT; }
     const std::string& GetTypeName() const { return typeName_; }
@@ -122,7 +130,6 @@ public:
     const std::vector<Field>& GetFields() const { return fields_; }
 
 private:
-    explicit MetaStruct(const std::string& typeName) : typeName_(typeName) {}
     std::string typeName_;
     std::vector<Field> fields_;
 };
@@ -132,8 +139,10 @@ private:
 // tells a formatter which columns it would have had.
 class MetaList : public MetaObject {
 public:
-    static boost::shared_ptr<MetaList> New(int elementType,
-                                           const MetaObjectPtr& elementTemplate = MetaObjectPtr());
+    static boost::shared_ptr<MetaList> New(int elementType, const MetaObjectPtr& elementTemplate = MetaObjectPtr());
+
+    MetaList(Token, int elementType, const MetaObjectPtr& elementTemplate)
+        : elementType_(elementType), elementTemplate_(elementTemplate) {}
 
     MetaType GetType() const override { return META_LIST; }
     int GetElementType() const { return elementType_; }
@@ -150,8 +159,6 @@ public:
     std::size_t Size() const { return elements_.size(); }
 
 private:
-    MetaList(int elementType, const MetaObjectPtr& elementTemplate)
-        : elementType_(elementType), elementTemplate_(elementTemplate) {}
     int elementType_;
     MetaObjectPtr elementTemplate_;
     std::vector<MetaObjectPtr> elements_;

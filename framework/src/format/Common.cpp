@@ -15,15 +15,18 @@ void AddUnique(std::vector<std::string>& names, const std::string& name) {
     if (!Contains(names, name)) names.push_back(name);
 }
 
-std::string RecordInline(const MetaStruct& record, const FormatHints& hints, const InlineStyle& style) {
-    std::string text = "{";
+void AppendRecordInline(std::string& out, const MetaStruct& record, const FormatHints& hints,
+                        const InlineStyle& style) {
+    out += '{';
     const char* separator = "";
-    for (const auto& field : SelectFields(record, hints, FieldSelection::HintedOnly)) {
-        text += separator + field.first + ": " +
-                InlineText(field.second, record.GetTypeName(), field.first, hints, style);
+    for (const MetaStruct::Field* field : SelectFields(record, hints, FieldSelection::HintedOnly)) {
+        out += separator;
+        out += field->first;
+        out += ": ";
+        AppendInlineText(out, *field->second, record.GetTypeName(), field->first, hints, style);
         separator = ", ";
     }
-    return text + "}";
+    out += '}';
 }
 
 // The columns of a table: the type's column hint, else its fields hint, else
@@ -63,104 +66,166 @@ std::vector<std::string> ChooseColumns(const std::vector<const MetaStruct*>& rec
 
 }  // namespace
 
-bool IsPresent(const MetaObjectPtr& value) { return value && value->HasValue(); }
+bool IsPresent(const MetaObjectPtr& value) {
+    return value && value->HasValue();
+}
 
-const MetaStruct* AsRecord(const MetaObjectPtr& value) { return dynamic_cast<const MetaStruct*>(value.get()); }
+// Records and lists are made only by their own New(), so the type tag tells
+// what a value is.
+const MetaStruct* AsRecord(const MetaObject* value) {
+    return value && value->GetType() == MetaObj::META_STRUCT ? static_cast<const MetaStruct*>(value) : nullptr;
+}
 
-const MetaList* AsList(const MetaObjectPtr& value) { return dynamic_cast<const MetaList*>(value.get()); }
+const MetaList* AsList(const MetaObject* value) {
+    return value && value->GetType() == MetaObj::META_LIST ? static_cast<const MetaList*>(value) : nullptr;
+}
 
 bool IsRecordList(const MetaObjectPtr& value) {
     const MetaList* list = AsList(value);
     return list && list->GetElementType() == MetaObj::META_STRUCT;
 }
 
-std::string ScalarText(const MetaObject& value) {
+void AppendScalarText(std::string& out, const MetaObject& value) {
     switch (value.GetType()) {
-    case MetaObj::META_STRING: return static_cast<const MetaObj::MetaString&>(value).GetValue();
-    case MetaObj::META_INT: return static_cast<const MetaObj::MetaInt&>(value).ToString();
-    case MetaObj::META_BOOL: return static_cast<const MetaObj::MetaBool&>(value).GetValue() ? "true" : "false";
-    default: return "";
+        case MetaObj::META_STRING:
+            out += static_cast<const MetaObj::MetaString&>(value).GetValue();
+            break;
+        case MetaObj::META_INT:
+            out += static_cast<const MetaObj::MetaInt&>(value).ToString();
+            break;
+        case MetaObj::META_BOOL:
+            out += static_cast<const MetaObj::MetaBool&>(value).GetValue() ? "true" : "false";
+            break;
+        default:
+            break;
     }
 }
 
-std::vector<MetaObjectPtr> PresentElements(const MetaList& list) {
-    std::vector<MetaObjectPtr> elements;
+std::string ScalarText(const MetaObject& value) {
+    std::string text;
+    AppendScalarText(text, value);
+    return text;
+}
+
+std::vector<const MetaObject*> PresentElements(const MetaList& list) {
+    std::vector<const MetaObject*> elements;
+    elements.reserve(list.Size());
     for (const auto& element : list.GetElements()) {
-        if (IsPresent(element)) elements.push_back(element);
+        if (IsPresent(element)) elements.push_back(element.get());
     }
     return elements;
 }
 
-std::vector<MetaStruct::Field> SelectFields(const MetaStruct& record, const FormatHints& hints,
-                                            FieldSelection selection) {
-    std::vector<MetaStruct::Field> present;
-    for (const auto& field : record.GetFields()) {
-        if (IsPresent(field.second)) present.push_back(field);
-    }
+std::vector<const MetaStruct::Field*> SelectFields(const MetaStruct& record, const FormatHints& hints,
+                                                   FieldSelection selection) {
+    const std::vector<MetaStruct::Field>& fields = record.GetFields();
+    std::vector<const MetaStruct::Field*> chosen;
+    chosen.reserve(fields.size());
+    auto choosePresent = [&](const std::vector<bool>* taken) {
+        for (std::size_t i = 0; i < fields.size(); ++i) {
+            if ((!taken || !(*taken)[i]) && IsPresent(fields[i].second)) chosen.push_back(&fields[i]);
+        }
+    };
     const std::optional<std::vector<std::string>>& hinted = hints.Fields(record.GetTypeName());
-    if (!hinted) return present;
+    if (!hinted) {
+        choosePresent(nullptr);
+        return chosen;
+    }
 
-    std::vector<MetaStruct::Field> chosen;
-    std::vector<bool> taken(present.size(), false);
+    // A record's field names are unique, so each hinted name takes at most
+    // one field. Commands set fields in the hint's order, so the search
+    // starts after the field the previous name took.
+    std::vector<bool> taken(fields.size(), false);
+    std::size_t next = 0;
     for (const auto& name : *hinted) {
-        for (std::size_t i = 0; i < present.size(); ++i) {
-            if (!taken[i] && present[i].first == name) {
-                chosen.push_back(present[i]);
+        for (std::size_t step = 0; step < fields.size(); ++step) {
+            const std::size_t i = (next + step) % fields.size();
+            if (fields[i].first != name) continue;
+            if (!taken[i] && IsPresent(fields[i].second)) {
+                chosen.push_back(&fields[i]);
                 taken[i] = true;
+                next = i + 1;
             }
+            break;
         }
     }
-    if (chosen.empty()) return present;
-    if (selection == FieldSelection::HintedFirst) {
-        for (std::size_t i = 0; i < present.size(); ++i) {
-            if (!taken[i]) chosen.push_back(present[i]);
-        }
+    if (chosen.empty()) {
+        choosePresent(nullptr);
+    } else if (selection == FieldSelection::HintedFirst) {
+        choosePresent(&taken);
     }
     return chosen;
 }
 
-std::string InlineText(const MetaObjectPtr& value, const std::string& type, const std::string& field,
-                       const FormatHints& hints, const InlineStyle& style) {
-    if (const MetaStruct* record = AsRecord(value)) return RecordInline(*record, hints, style);
-    if (const MetaList* list = AsList(value)) {
+void AppendInlineText(std::string& out, const MetaObject& value, const std::string& type, const std::string& field,
+                      const FormatHints& hints, const InlineStyle& style) {
+    if (const MetaStruct* record = AsRecord(&value)) {
+        AppendRecordInline(out, *record, hints, style);
+        return;
+    }
+    if (const MetaList* list = AsList(&value)) {
         bool records = list->GetElementType() == MetaObj::META_STRUCT;
-        std::string text;
         const char* separator = "";
-        for (const auto& element : PresentElements(*list)) {
-            text += separator;
-            text += records ? RecordInline(*AsRecord(element), hints, style) : ScalarText(*element);
+        for (const MetaObject* element : PresentElements(*list)) {
+            out += separator;
+            if (records) {
+                AppendRecordInline(out, *AsRecord(element), hints, style);
+            } else {
+                AppendScalarText(out, *element);
+            }
             separator = records ? ", " : style.listSeparator;
         }
-        return text;
+        return;
     }
-    std::string text = ScalarText(*value);
+    AppendScalarText(out, value);
     if (style.units) {
         std::string unit = hints.Unit(type, field);
-        if (!unit.empty()) text += " " + unit;
+        if (!unit.empty()) {
+            out += ' ';
+            out += unit;
+        }
     }
+}
+
+InlineStyle ForHints(const InlineStyle& style, const FormatHints& hints) {
+    static const std::string kUnitsPrefix = "units:";
+    auto first = hints.Raw().lower_bound(kUnitsPrefix);
+    const bool anyUnit = first != hints.Raw().end() && first->first.compare(0, kUnitsPrefix.size(), kUnitsPrefix) == 0;
+    return InlineStyle{style.listSeparator, style.units && anyUnit};
+}
+
+std::string InlineText(const MetaObjectPtr& value, const std::string& type, const std::string& field,
+                       const FormatHints& hints, const InlineStyle& style) {
+    std::string text;
+    AppendInlineText(text, *value, type, field, hints, style);
     return text;
 }
 
 bool BuildTable(const MetaObject& result, const FormatHints& hints, const InlineStyle& style, Table& table) {
     std::vector<const MetaStruct*> records;
     const MetaStruct* elementTemplate = nullptr;
-    if (const auto* record = dynamic_cast<const MetaStruct*>(&result)) {
+    if (const MetaStruct* record = AsRecord(&result)) {
         records.push_back(record);
-    } else if (const auto* list = dynamic_cast<const MetaList*>(&result);
-               list && list->GetElementType() == MetaObj::META_STRUCT) {
+    } else if (const MetaList* list = AsList(&result); list && list->GetElementType() == MetaObj::META_STRUCT) {
         elementTemplate = AsRecord(list->GetElementTemplate());
-        for (const auto& element : PresentElements(*list)) records.push_back(AsRecord(element));
+        for (const MetaObject* element : PresentElements(*list)) records.push_back(AsRecord(element));
     } else {
         return false;
     }
 
     table.columns = ChooseColumns(records, elementTemplate, hints);
     table.rows.clear();
+    table.rows.reserve(records.size());
     for (const MetaStruct* record : records) {
-        std::vector<std::string> row;
-        for (const auto& column : table.columns) {
-            MetaObjectPtr value = record->GetField(column);
-            row.push_back(IsPresent(value) ? InlineText(value, record->GetTypeName(), column, hints, style) : "");
+        std::vector<std::string> row(table.columns.size());
+        for (std::size_t i = 0; i < table.columns.size(); ++i) {
+            for (const auto& field : record->GetFields()) {
+                if (field.first != table.columns[i]) continue;
+                if (IsPresent(field.second)) {
+                    AppendInlineText(row[i], *field.second, record->GetTypeName(), field.first, hints, style);
+                }
+                break;
+            }
         }
         table.rows.push_back(std::move(row));
     }
@@ -200,6 +265,10 @@ std::size_t DecodeUtf8(const std::string& text, std::size_t pos, char32_t& codeP
 }
 
 std::size_t DisplayWidth(const std::string& text) {
+    // Most text is ASCII, one character a byte.
+    if (std::all_of(text.begin(), text.end(), [](char c) { return static_cast<unsigned char>(c) < 0x80; })) {
+        return text.size();
+    }
     std::size_t width = 0;
     char32_t ignored;
     for (std::size_t pos = 0; pos < text.size(); pos += DecodeUtf8(text, pos, ignored)) ++width;

@@ -24,24 +24,34 @@ using MetaObj::MetaStruct;
 bool IsPresent(const MetaObjectPtr& value);
 
 // Typed views of a value; null when it is of another kind.
-const MetaStruct* AsRecord(const MetaObjectPtr& value);
-const MetaList* AsList(const MetaObjectPtr& value);
+const MetaStruct* AsRecord(const MetaObject* value);
+const MetaList* AsList(const MetaObject* value);
+inline const MetaStruct* AsRecord(const MetaObjectPtr& value) {
+    return AsRecord(value.get());
+}
+inline const MetaList* AsList(const MetaObjectPtr& value) {
+    return AsList(value.get());
+}
 bool IsRecordList(const MetaObjectPtr& value);
 
 // "abc", "42", "true": the text of a string, int or bool.
 std::string ScalarText(const MetaObject& value);
+// The same, appended to `out`.
+void AppendScalarText(std::string& out, const MetaObject& value);
 
-// The elements of a list that are present, in order.
-std::vector<MetaObjectPtr> PresentElements(const MetaList& list);
+// The elements of a list that are present, in order. The pointers are valid
+// as long as the list is.
+std::vector<const MetaObject*> PresentElements(const MetaList& list);
 
 // The present fields of a record in display order. With the record type's
 // "fields:" hint, the hinted fields the record has come first, in hint order;
 // HintedOnly stops there (the human formats), HintedFirst then adds the
 // record's other fields in record order (the machine formats). A hint that
-// matches none of the record's fields is ignored.
+// matches none of the record's fields is ignored. The pointers are valid as
+// long as the record is.
 enum class FieldSelection { HintedOnly, HintedFirst };
-std::vector<MetaStruct::Field> SelectFields(const MetaStruct& record, const FormatHints& hints,
-                                            FieldSelection selection);
+std::vector<const MetaStruct::Field*> SelectFields(const MetaStruct& record, const FormatHints& hints,
+                                                   FieldSelection selection);
 
 // How a value reads inside one line or one table cell.
 struct InlineStyle {
@@ -49,11 +59,18 @@ struct InlineStyle {
     bool units;                 // a scalar is followed by its unit word, if any
 };
 
+// The style with units turned off when no hint gives any, so that values
+// need no lookup of their unit: most commands set none.
+InlineStyle ForHints(const InlineStyle& style, const FormatHints& hints);
+
 // The one-line text of a field's value: a scalar (with its unit when the
 // style asks), a string list joined, a record as "{Name: value, ...}", a list
 // of records as such items joined by ", ".
 std::string InlineText(const MetaObjectPtr& value, const std::string& type, const std::string& field,
                        const FormatHints& hints, const InlineStyle& style);
+// The same, appended to `out`.
+void AppendInlineText(std::string& out, const MetaObject& value, const std::string& type, const std::string& field,
+                      const FormatHints& hints, const InlineStyle& style);
 
 // A result laid out as columns and rows of cell text, for table and csv.
 struct Table {
@@ -70,7 +87,9 @@ bool BuildTable(const MetaObject& result, const FormatHints& hints, const Inline
 // overlong, a surrogate, above U+10FFFF) decodes as U+FFFD and takes one byte.
 std::size_t DecodeUtf8(const std::string& text, std::size_t pos, char32_t& codePoint);
 // True when DecodeUtf8 stood in for a bad byte rather than read a real U+FFFD.
-inline bool IsBadByte(char32_t codePoint, std::size_t length) { return codePoint == 0xFFFD && length == 1; }
+inline bool IsBadByte(char32_t codePoint, std::size_t length) {
+    return codePoint == 0xFFFD && length == 1;
+}
 
 // Rewrites a text character by character. `replace` is called with each
 // character (a bad byte as U+FFFD, with badByte set) and returns the text to

@@ -36,8 +36,8 @@ void WriteCsv(const MetaObject& result, const FormatHints& hints, std::ostream& 
         if (table.columns.empty()) return;
         WriteRow(table.columns, out);
         for (const auto& row : table.rows) WriteRow(row, out);
-    } else if (const auto* list = dynamic_cast<const MetaList*>(&result)) {
-        for (const auto& element : PresentElements(*list)) out << Cell(ScalarText(*element)) << '\n';
+    } else if (const MetaList* list = AsList(&result)) {
+        for (const MetaObject* element : PresentElements(*list)) out << Cell(ScalarText(*element)) << '\n';
     } else {
         out << Cell(ScalarText(result)) << '\n';
     }

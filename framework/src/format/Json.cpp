@@ -12,21 +12,31 @@ namespace {
 // A JSON string literal. Control characters and bytes that are not UTF-8
 // become escapes; every other character passes through as it is.
 std::string Quote(const std::string& text) {
-    return '"' + Recode(text, [](char32_t c, bool badByte) -> std::optional<std::string> {
-        switch (c) {
-        case '"': return "\\\"";
-        case '\\': return "\\\\";
-        case '\b': return "\\b";
-        case '\f': return "\\f";
-        case '\n': return "\\n";
-        case '\r': return "\\r";
-        case '\t': return "\\t";
-        }
-        if (c >= 0x20 && !badByte) return std::nullopt;
-        char escape[8];
-        std::snprintf(escape, sizeof escape, "\\u%04x", static_cast<unsigned>(c));
-        return std::string(escape);
-    }) + '"';
+    return '"' +
+           Recode(text,
+                  [](char32_t c, bool badByte) -> std::optional<std::string> {
+                      switch (c) {
+                          case '"':
+                              return "\\\"";
+                          case '\\':
+                              return "\\\\";
+                          case '\b':
+                              return "\\b";
+                          case '\f':
+                              return "\\f";
+                          case '\n':
+                              return "\\n";
+                          case '\r':
+                              return "\\r";
+                          case '\t':
+                              return "\\t";
+                      }
+                      if (c >= 0x20 && !badByte) return std::nullopt;
+                      char escape[8];
+                      std::snprintf(escape, sizeof escape, "\\u%04x", static_cast<unsigned>(c));
+                      return std::string(escape);
+                  }) +
+           '"';
 }
 
 class JsonWriter {
@@ -34,15 +44,15 @@ public:
     JsonWriter(const FormatHints& hints, std::ostream& out) : hints_(hints), out_(out) {}
 
     void Value(const MetaObject& value, std::size_t depth) {
-        if (const auto* record = dynamic_cast<const MetaStruct*>(&value)) {
+        if (const MetaStruct* record = AsRecord(&value)) {
             Block('{', '}', SelectFields(*record, hints_, FieldSelection::HintedFirst), depth,
-                  [&](const MetaStruct::Field& field) {
-                      out_ << Quote(field.first) << ": ";
-                      Value(*field.second, depth + 1);
+                  [&](const MetaStruct::Field* field) {
+                      out_ << Quote(field->first) << ": ";
+                      Value(*field->second, depth + 1);
                   });
-        } else if (const auto* list = dynamic_cast<const MetaList*>(&value)) {
+        } else if (const MetaList* list = AsList(&value)) {
             Block('[', ']', PresentElements(*list), depth,
-                  [&](const MetaObjectPtr& element) { Value(*element, depth + 1); });
+                  [&](const MetaObject* element) { Value(*element, depth + 1); });
         } else if (value.GetType() == MetaObj::META_STRING) {
             out_ << Quote(ScalarText(value));
         } else {

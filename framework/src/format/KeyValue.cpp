@@ -11,10 +11,17 @@ std::string Escape(const std::string& text) {
     std::string escaped;
     for (char c : text) {
         switch (c) {
-        case '\\': escaped += "\\\\"; break;
-        case '\n': escaped += "\\n"; break;
-        case '\r': escaped += "\\r"; break;
-        default: escaped += c;
+            case '\\':
+                escaped += "\\\\";
+                break;
+            case '\n':
+                escaped += "\\n";
+                break;
+            case '\r':
+                escaped += "\\r";
+                break;
+            default:
+                escaped += c;
         }
     }
     return escaped;
@@ -27,10 +34,10 @@ public:
     // Lists of records at the top name each element by its own type; every
     // other list inherits the key of what holds it.
     void Result(const MetaObject& result) {
-        if (const auto* record = dynamic_cast<const MetaStruct*>(&result)) {
+        if (const MetaStruct* record = AsRecord(&result)) {
             Value(record->GetTypeName(), result);
-        } else if (const auto* list = dynamic_cast<const MetaList*>(&result)) {
-            std::vector<MetaObjectPtr> elements = PresentElements(*list);
+        } else if (const MetaList* list = AsList(&result)) {
+            std::vector<const MetaObject*> elements = PresentElements(*list);
             for (std::size_t i = 0; i < elements.size(); ++i) {
                 const MetaStruct* element = AsRecord(elements[i]);
                 Value(Indexed(element ? element->GetTypeName() : "", i), *elements[i]);
@@ -46,12 +53,12 @@ private:
     }
 
     void Value(const std::string& key, const MetaObject& value) {
-        if (const auto* record = dynamic_cast<const MetaStruct*>(&value)) {
-            for (const auto& field : SelectFields(*record, hints_, FieldSelection::HintedFirst)) {
-                Value(key + "." + field.first, *field.second);
+        if (const MetaStruct* record = AsRecord(&value)) {
+            for (const MetaStruct::Field* field : SelectFields(*record, hints_, FieldSelection::HintedFirst)) {
+                Value(key + "." + field->first, *field->second);
             }
-        } else if (const auto* list = dynamic_cast<const MetaList*>(&value)) {
-            std::vector<MetaObjectPtr> elements = PresentElements(*list);
+        } else if (const MetaList* list = AsList(&value)) {
+            std::vector<const MetaObject*> elements = PresentElements(*list);
             for (std::size_t i = 0; i < elements.size(); ++i) Value(Indexed(key, i), *elements[i]);
         } else {
             out_ << key << '=' << Escape(ScalarText(value)) << '\n';

@@ -9,23 +9,33 @@ namespace {
 
 const InlineStyle kSimpleStyle{", ", true};
 const std::size_t kIndentStep = 3;
+const std::size_t kFlushSize = 32 * 1024;
 
+// Lines are gathered in a buffer and written out a record at a time once it
+// holds enough: a listing of a thousand records makes tens of thousands of
+// small pieces.
 class SimpleWriter {
 public:
-    SimpleWriter(const FormatHints& hints, std::ostream& out) : hints_(hints), out_(out) {}
+    SimpleWriter(const FormatHints& hints, std::ostream& out)
+        : hints_(hints), style_(ForHints(kSimpleStyle, hints)), out_(out) {}
 
     void Result(const MetaObject& result) {
-        if (const auto* record = dynamic_cast<const MetaStruct*>(&result)) {
+        if (const MetaStruct* record = AsRecord(&result)) {
             Record(*record, 0, kIndentStep);
-        } else if (const auto* list = dynamic_cast<const MetaList*>(&result)) {
+        } else if (const MetaList* list = AsList(&result)) {
             if (list->GetElementType() == MetaObj::META_STRUCT) {
                 RecordList(*list, 0, kIndentStep);
             } else {
-                for (const auto& element : PresentElements(*list)) out_ << ScalarText(*element) << '\n';
+                for (const MetaObject* element : PresentElements(*list)) {
+                    AppendScalarText(text_, *element);
+                    text_ += '\n';
+                }
             }
         } else if (!IsSuccess(result)) {
-            out_ << ScalarText(result) << '\n';
+            AppendScalarText(text_, result);
+            text_ += '\n';
         }
+        Flush();
     }
 
 private:
@@ -34,12 +44,18 @@ private:
         return result.GetType() == MetaObj::META_BOOL && static_cast<const MetaObj::MetaBool&>(result).GetValue();
     }
 
+    void Flush() {
+        out_.write(text_.data(), static_cast<std::streamsize>(text_.size()));
+        text_.clear();
+    }
+
     void RecordList(const MetaList& list, std::size_t headerIndent, std::size_t fieldIndent) {
         const char* separator = "";
-        for (const auto& element : PresentElements(list)) {
-            out_ << separator;
+        for (const MetaObject* element : PresentElements(list)) {
+            text_ += separator;
             Record(*AsRecord(element), headerIndent, fieldIndent);
             separator = "\n";
+            if (text_.size() >= kFlushSize) Flush();
         }
     }
 
@@ -47,54 +63,70 @@ private:
         const std::string& type = record.GetTypeName();
         const std::optional<std::string>& header = hints_.Header(type);
         if (header && !hints_.HasNoHeader(type)) {
-            out_ << std::string(headerIndent, ' ') << Substitute(*header, record) << '\n';
+            text_.append(headerIndent, ' ');
+            Substitute(*header, record);
+            text_ += '\n';
         }
-        for (const auto& field : SelectFields(record, hints_, FieldSelection::HintedOnly)) {
-            Field(type, field, fieldIndent);
+        for (const MetaStruct::Field* field : SelectFields(record, hints_, FieldSelection::HintedOnly)) {
+            Field(type, *field, fieldIndent);
         }
     }
 
     void Field(const std::string& type, const MetaStruct::Field& field, std::size_t indent) {
-        out_ << std::string(indent, ' ') << field.first << ':';
+        text_.append(indent, ' ');
+        text_ += field.first;
+        text_ += ':';
         // A nested record's own heading sits at the same depth as its fields,
         // so a heading never lines up with the field name that holds it.
         if (const MetaStruct* record = AsRecord(field.second)) {
-            out_ << '\n';
+            text_ += '\n';
             Record(*record, indent + kIndentStep, indent + kIndentStep);
         } else if (IsRecordList(field.second)) {
-            out_ << '\n';
+            text_ += '\n';
             RecordList(*AsList(field.second), indent + kIndentStep, indent + kIndentStep);
         } else {
-            out_ << ' ' << InlineText(field.second, type, field.first, hints_, kSimpleStyle) << '\n';
+            text_ += ' ';
+            AppendInlineText(text_, *field.second, type, field.first, hints_, style_);
+            text_ += '\n';
         }
     }
 
     // Replaces each "%Field Name%" by that field's value. A pair of percent
     // signs around something that is not a field stays as written, and its
     // closing sign may still open a real placeholder ("100% of %Name%").
-    std::string Substitute(const std::string& header, const MetaStruct& record) const {
-        std::string text;
+    void Substitute(const std::string& header, const MetaStruct& record) {
         std::string::size_type pos = 0;
         for (;;) {
             std::string::size_type open = header.find('%', pos);
             std::string::size_type close = open == std::string::npos ? open : header.find('%', open + 1);
             if (close == std::string::npos) break;
-            std::string name = header.substr(open + 1, close - open - 1);
-            MetaObjectPtr value = record.GetField(name);
-            text.append(header, pos, open - pos);
-            if (IsPresent(value)) {
-                text += InlineText(value, record.GetTypeName(), name, hints_, kSimpleStyle);
+            const MetaObjectPtr* value = FindField(record, header, open + 1, close);
+            text_.append(header, pos, open - pos);
+            if (value && IsPresent(*value)) {
+                AppendInlineText(text_, **value, record.GetTypeName(), header.substr(open + 1, close - open - 1),
+                                 hints_, style_);
                 pos = close + 1;
             } else {
-                text += '%';
+                text_ += '%';
                 pos = open + 1;
             }
         }
-        return text.append(header, pos, std::string::npos);
+        text_.append(header, pos, std::string::npos);
+    }
+
+    // The value of the field named by header[begin, end), or null.
+    static const MetaObjectPtr* FindField(const MetaStruct& record, const std::string& header,
+                                          std::string::size_type begin, std::string::size_type end) {
+        for (const auto& field : record.GetFields()) {
+            if (header.compare(begin, end - begin, field.first) == 0) return &field.second;
+        }
+        return nullptr;
     }
 
     const FormatHints& hints_;
+    const InlineStyle style_;
     std::ostream& out_;
+    std::string text_;
 };
 
 }  // namespace

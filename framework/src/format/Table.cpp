@@ -11,25 +11,27 @@ namespace {
 
 const InlineStyle kTableStyle{", ", true};
 const char kColumnGap[] = "  ";
+const std::size_t kFlushSize = 32 * 1024;
 
-void WriteRow(const std::vector<std::string>& cells, const std::vector<std::size_t>& widths, std::ostream& out) {
-    std::string line;
+void AppendRow(std::string& text, const std::vector<std::string>& cells, const std::vector<std::size_t>& widths) {
+    const std::size_t start = text.size();
     for (std::size_t i = 0; i < cells.size(); ++i) {
-        if (i > 0) line += kColumnGap;
-        line += cells[i];
-        if (i + 1 < cells.size()) line.append(widths[i] - DisplayWidth(cells[i]), ' ');
+        if (i > 0) text += kColumnGap;
+        text += cells[i];
+        if (i + 1 < cells.size()) text.append(widths[i] - DisplayWidth(cells[i]), ' ');
     }
     // Empty cells at the end of a row would otherwise leave the padding and
     // gaps before them hanging.
-    line.erase(line.find_last_not_of(' ') + 1);
-    out << line << '\n';
+    const std::size_t end = text.find_last_not_of(' ');
+    text.erase(end == std::string::npos || end < start ? start : end + 1);
+    text += '\n';
 }
 
 }  // namespace
 
 void WriteTable(const MetaObject& result, const FormatHints& hints, std::ostream& out) {
     Table table;
-    if (!BuildTable(result, hints, kTableStyle, table)) {
+    if (!BuildTable(result, hints, ForHints(kTableStyle, hints), table)) {
         WriteSimple(result, hints, out);
         return;
     }
@@ -43,9 +45,19 @@ void WriteTable(const MetaObject& result, const FormatHints& hints, std::ostream
         widths.push_back(width);
         dashes.emplace_back(width, '-');
     }
-    WriteRow(table.columns, widths, out);
-    WriteRow(dashes, widths, out);
-    for (const auto& row : table.rows) WriteRow(row, widths, out);
+    // Rows are gathered and written out in pieces of a few kilobytes.
+    std::string text;
+    auto flush = [&] {
+        out.write(text.data(), static_cast<std::streamsize>(text.size()));
+        text.clear();
+    };
+    AppendRow(text, table.columns, widths);
+    AppendRow(text, dashes, widths);
+    for (const auto& row : table.rows) {
+        AppendRow(text, row, widths);
+        if (text.size() >= kFlushSize) flush();
+    }
+    flush();
 }
 
 }  // namespace Formatting

@@ -14,16 +14,25 @@ namespace {
 std::string Escape(const std::string& text, bool attribute) {
     return Recode(text, [attribute](char32_t c, bool badByte) -> std::optional<std::string> {
         switch (c) {
-        case '&': return "&amp;";
-        case '<': return "&lt;";
-        case '>': return "&gt;";
-        case '"': return "&quot;";
-        case '\'': return "&apos;";
-        case '\r': return "&#13;";
-        case '\t': return attribute ? "&#9;" : "\t";
-        case '\n': return attribute ? "&#10;" : "\n";
-        case 0xFFFE:
-        case 0xFFFF: return "";
+            case '&':
+                return "&amp;";
+            case '<':
+                return "&lt;";
+            case '>':
+                return "&gt;";
+            case '"':
+                return "&quot;";
+            case '\'':
+                return "&apos;";
+            case '\r':
+                return "&#13;";
+            case '\t':
+                return attribute ? "&#9;" : "\t";
+            case '\n':
+                return attribute ? "&#10;" : "\n";
+            case 0xFFFE:
+            case 0xFFFF:
+                return "";
         }
         if (badByte) return "\xEF\xBF\xBD";
         if (c < 0x20) return "";
@@ -38,7 +47,7 @@ bool IsInline(const MetaObject& value) {
 }
 
 std::string Scalar(const MetaObject& value) {
-    const char* tag = value.GetType() == MetaObj::META_INT ? "integer"
+    const char* tag = value.GetType() == MetaObj::META_INT    ? "integer"
                       : value.GetType() == MetaObj::META_BOOL ? "boolean"
                                                               : "string";
     return std::string("<") + tag + ">" + Escape(ScalarText(value), false) + "</" + tag + ">";
@@ -48,10 +57,10 @@ const char kStringListOpen[] = "<list type=\"string\">";
 
 // A scalar, or a list of strings on one line.
 std::string Inline(const MetaObject& value) {
-    const auto* list = dynamic_cast<const MetaList*>(&value);
+    const MetaList* list = AsList(&value);
     if (!list) return Scalar(value);
     std::string text = kStringListOpen;
-    for (const auto& element : PresentElements(*list)) text += Scalar(*element);
+    for (const MetaObject* element : PresentElements(*list)) text += Scalar(*element);
     return text + "</list>";
 }
 
@@ -60,14 +69,14 @@ public:
     XmlWriter(const FormatHints& hints, std::ostream& out) : hints_(hints), out_(out) {}
 
     void Value(const MetaObject& value, std::size_t depth) {
-        if (const auto* record = dynamic_cast<const MetaStruct*>(&value)) {
+        if (const MetaStruct* record = AsRecord(&value)) {
             Element(depth, "<structure typeName=\"" + Escape(record->GetTypeName(), true) + "\">", "</structure>",
                     SelectFields(*record, hints_, FieldSelection::HintedFirst),
-                    [&](const MetaStruct::Field& field) { Field(field, depth + 1); });
-        } else if (const auto* list = dynamic_cast<const MetaList*>(&value)) {
+                    [&](const MetaStruct::Field* field) { Field(*field, depth + 1); });
+        } else if (const MetaList* list = AsList(&value)) {
             bool records = list->GetElementType() == MetaObj::META_STRUCT;
-            Element(depth, records ? "<list type=\"structure\">" : kStringListOpen, "</list>",
-                    PresentElements(*list), [&](const MetaObjectPtr& element) { Value(*element, depth + 1); });
+            Element(depth, records ? "<list type=\"structure\">" : kStringListOpen, "</list>", PresentElements(*list),
+                    [&](const MetaObject* element) { Value(*element, depth + 1); });
         } else {
             Line(depth, Scalar(value));
         }

@@ -3,7 +3,7 @@
 #include "Operation.h"
 #include "hostctl/network/ip/PldNic.h"
 #include "hostctl/network/vswitch/SwitchImpl.h"
-#include "network/Document.h"
+#include "network/vswitch/VswitchRecords.h"
 
 namespace HostCtl {
 namespace Network {
@@ -14,17 +14,21 @@ PortGroup::~PortGroup() = default;
 PldNic::~PldNic() = default;
 
 std::unique_ptr<VirtualSwitch> NetworkFactory::GetVirtualSwitchById(const std::string& name) {
+    using PldCtl::Detail::VswitchRecord;
     PldCtl::Store::HostStore& store = PldCtl::Detail::EnterOperation("NetworkFactory::GetVirtualSwitchById", name);
-    std::optional<PldCtl::Store::Json> vswitch = store.Get("vswitches", name);
+    std::optional<VswitchRecord> vswitch = PldCtl::Detail::Get<VswitchRecord>(store, name);
     if (!vswitch) return nullptr;
-    return std::make_unique<PldCtl::Network::VirtualSwitchImpl>(PldCtl::Detail::MakeDocument(std::move(*vswitch)));
+    return std::make_unique<PldCtl::Network::VirtualSwitchImpl>(
+        std::make_shared<const VswitchRecord>(std::move(*vswitch)));
 }
 
 std::unique_ptr<PortGroup> NetworkFactory::GetPortGroupByName(const std::string& name) {
+    using PldCtl::Detail::PortGroupRecord;
     PldCtl::Store::HostStore& store = PldCtl::Detail::EnterOperation("NetworkFactory::GetPortGroupByName", name);
-    std::optional<PldCtl::Store::Json> portGroup = store.Get("portgroups", name);
+    std::optional<PortGroupRecord> portGroup = PldCtl::Detail::Get<PortGroupRecord>(store, name);
     if (!portGroup) return nullptr;
-    return std::make_unique<PldCtl::Network::PortGroupImpl>(PldCtl::Detail::MakeDocument(std::move(*portGroup)));
+    return std::make_unique<PldCtl::Network::PortGroupImpl>(
+        std::make_shared<const PortGroupRecord>(std::move(*portGroup)));
 }
 
 }  // namespace Network

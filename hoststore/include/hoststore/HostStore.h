@@ -20,6 +20,7 @@
 #include <optional>
 #include <stdexcept>
 #include <string>
+#include <unordered_map>
 #include <vector>
 
 #include <nlohmann/json.hpp>
@@ -158,6 +159,29 @@ public:
     Json GetSingleton(const std::string& name);
     void PutSingleton(const std::string& name, const Json& object);
 
+    // ---- Stored text -------------------------------------------------------
+    // The same reads, handing out each object's JSON text as stored instead of
+    // a parsed object, for callers that decode only the fields they need.
+    std::optional<std::string> GetText(const std::string& section, const std::string& key);
+    std::vector<std::string> ListText(const std::string& section);
+    std::vector<std::string> ListChildrenText(const std::string& section, const std::string& parent);
+    std::vector<std::string> ListByParentOrderText(const std::string& section);
+    // "{}" when the singleton was never written.
+    std::string GetSingletonText(const std::string& name);
+    // The keys of a collection's objects, in its order.
+    std::vector<std::string> ListKeys(const std::string& section);
+    // The objects of a collection counted per parent (`byField` empty) or per
+    // value of a field, in one pass over the rows as they are stored, with no
+    // sorting: for each group, all its objects and those of them that pass
+    // every test. Objects with no parent or no value are not counted.
+    struct GroupCount {
+        std::int64_t all = 0;
+        std::int64_t passing = 0;
+    };
+    std::unordered_map<std::string, GroupCount> CountGroups(const std::string& section, const std::string& byField,
+                                                            const std::vector<FieldTest>& tests);
+    // ---- end of stored text ------------------------------------------------
+
 private:
     friend class HostStore;
     explicit Transaction(HostStore& store) : store_(store) {}
@@ -219,6 +243,17 @@ public:
     Json GetSingleton(const std::string& name);
     std::int64_t CountChildren(const std::string& section, const std::string& parent,
                                const std::vector<FieldTest>& tests = {});
+
+    // ---- Stored text -------------------------------------------------------
+    // Single reads of objects' JSON text as stored (see Transaction).
+    std::optional<std::string> GetText(const std::string& section, const std::string& key);
+    std::vector<std::string> ListText(const std::string& section);
+    std::vector<std::string> ListChildrenText(const std::string& section, const std::string& parent);
+    std::string GetSingletonText(const std::string& name);
+    // The error a caller throws when text it read from this store does not
+    // decode as a JSON object: the store is damaged.
+    StoreError DamagedObjectError() const;
+    // ---- end of stored text ------------------------------------------------
 
     // Several reads that see one state of the host.
     void Read(const std::function<void(Transaction&)>& fn);

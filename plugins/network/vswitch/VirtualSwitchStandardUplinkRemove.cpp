@@ -31,10 +31,8 @@ boost::shared_ptr<CallSpec::OutputSpec> VirtualSwitchStandardUplinkRemove::GetOu
 void VirtualSwitchStandardUplinkRemove::ExecuteInternal(boost::shared_ptr<CallSpec::Input> input,
                                                         boost::shared_ptr<CallSpec::Output> output) {
     const std::string uplink = input->GetString("uplink-name");
-    // The failover policies keep naming the uplink (false): changing them is
-    // a separate, explicit step for the user.
     ChangeStandardSwitch(output, input->GetString("vswitch-name"),
-                         [&](HostCtl::Network::VirtualSwitch& vswitch) { vswitch.RemoveUplink(uplink, false); });
+                         [&](HostCtl::Network::VirtualSwitch& vswitch) { vswitch.RemoveUplink(uplink); });
 }
 
 }  // namespace NetworkNamespace

@@ -2,6 +2,7 @@
 #include "hostctl/network/nic/PnicImpl.h"
 
 #include "Operation.h"
+#include "network/nic/NicRecords.h"
 
 HostCtl::Network::Pnic::~Pnic() = default;
 
@@ -14,7 +15,7 @@ PnicImpl::~PnicImpl() = default;
 
 bool PnicImpl::IsValidPnic(const std::string& name) {
     Store::HostStore& store = Detail::EnterOperation("PnicImpl::IsValidPnic", name);
-    return store.Get("nics", name).has_value();
+    return store.GetText(Detail::NicRecord::kSection, name).has_value();
 }
 
 std::string PnicImpl::GetName() const {

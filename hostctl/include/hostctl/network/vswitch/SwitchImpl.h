@@ -11,10 +11,9 @@
 
 namespace PldCtl {
 namespace Detail {
-// A stored object of the host, as the library read it.
-struct Document;
-// A switch read while listing all of them, with what the listing read for it.
-struct ListedSwitch;
+// The stored records of switches and port groups, private to the library.
+struct VswitchRecord;
+struct PortGroupRecord;
 }  // namespace Detail
 
 namespace Network {
@@ -35,11 +34,11 @@ public:
     std::vector<std::string> GetUplinks() const override;
 
 protected:
-    explicit PortsetImpl(std::shared_ptr<Detail::Document> document,
+    explicit PortsetImpl(std::shared_ptr<const Detail::VswitchRecord> record,
                          std::optional<std::pair<int, int>> portCounts = std::nullopt);
     // Takes the stored object as a change left it.
-    void Refresh(std::shared_ptr<Detail::Document> document);
-    std::shared_ptr<Detail::Document> document_;
+    void Refresh(std::shared_ptr<const Detail::VswitchRecord> record);
+    std::shared_ptr<const Detail::VswitchRecord> record_;
 
 private:
     // Read from the host's ports on first use: configured, used.
@@ -49,10 +48,12 @@ private:
 
 class VirtualSwitchImpl : public PortsetImpl, public virtual HostCtl::Network::VirtualSwitch {
 public:
-    // A snapshot of a stored "vswitches" object.
-    explicit VirtualSwitchImpl(std::shared_ptr<Detail::Document> document);
-    // The same, with the port counts and port groups a listing read for it.
-    explicit VirtualSwitchImpl(const Detail::ListedSwitch& listed);
+    // A snapshot of a stored switch.
+    explicit VirtualSwitchImpl(std::shared_ptr<const Detail::VswitchRecord> record);
+    // The same, with the port counts (configured, used) and the port groups a
+    // listing read for it.
+    VirtualSwitchImpl(std::shared_ptr<const Detail::VswitchRecord> record, std::pair<int, int> portCounts,
+                      std::vector<std::shared_ptr<const Detail::PortGroupRecord>> portGroups);
     ~VirtualSwitchImpl() override;
 
     int GetMTU() const override;
@@ -67,7 +68,7 @@ public:
     std::unique_ptr<HostCtl::Network::PortGroup> AddPortGroup(const std::string& name) override;
     void RemovePortGroup(const std::string& name) override;
     void AddUplink(const std::string& nic) override;
-    void RemoveUplink(const std::string& nic, bool removeFromPolicies) override;
+    void RemoveUplink(const std::string& nic) override;
     HostCtl::Network::NicTeamingPolicy GetTeamingPolicy() const override;
     HostCtl::Network::NicTeamingPolicy GetConfiguredTeamingPolicy() const override;
     void SetTeamingPolicy(const HostCtl::Network::NicTeamingPolicy& policy) override;
@@ -79,8 +80,8 @@ public:
 private:
     // The switch's port groups as stored, read on first use: listing a switch
     // asks for them twice (names, and which of them require beaconing).
-    const std::vector<std::shared_ptr<Detail::Document>>& PortGroupDocuments() const;
-    mutable std::optional<std::vector<std::shared_ptr<Detail::Document>>> portGroups_;
+    const std::vector<std::shared_ptr<const Detail::PortGroupRecord>>& PortGroupRecords() const;
+    mutable std::optional<std::vector<std::shared_ptr<const Detail::PortGroupRecord>>> portGroups_;
 };
 
 // A port group, found by name. Made from a name it never throws; its
@@ -88,9 +89,10 @@ private:
 class PortGroupImpl : public virtual HostCtl::Network::PortGroup {
 public:
     explicit PortGroupImpl(const std::string& name);
-    // A snapshot of a stored "portgroups" object; a listing that counted the
-    // active clients of every port group at once hands the count along.
-    explicit PortGroupImpl(std::shared_ptr<Detail::Document> document, std::optional<int> activeClients = std::nullopt);
+    // A snapshot of a stored port group; a listing that counted the active
+    // clients of every port group at once hands the count along.
+    explicit PortGroupImpl(std::shared_ptr<const Detail::PortGroupRecord> record,
+                           std::optional<int> activeClients = std::nullopt);
     ~PortGroupImpl() override;
 
     // The ports of the port group that are in use by a client.
@@ -113,11 +115,11 @@ public:
 
 private:
     // The stored object, read on first use.
-    const Detail::Document& Stored() const;
+    const Detail::PortGroupRecord& Stored() const;
     // The switch's stored object, for the policies in force.
-    std::shared_ptr<Detail::Document> SwitchDocument() const;
+    std::shared_ptr<const Detail::VswitchRecord> SwitchRecord() const;
     std::string name_;
-    mutable std::shared_ptr<Detail::Document> document_;
+    mutable std::shared_ptr<const Detail::PortGroupRecord> record_;
     std::optional<int> activeClients_;
 };
 

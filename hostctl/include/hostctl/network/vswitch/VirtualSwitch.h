@@ -72,11 +72,10 @@ public:
     // Throws for a NIC the host does not have or that is an uplink already,
     // or when the switch has no free port.
     virtual void AddUplink(const std::string& nic) = 0;
-    // Throws for a NIC that is not an uplink of this switch. With
-    // `removeFromPolicies`, the NIC is also taken out of the uplink order of
-    // the switch's and its port groups' failover policies; without it those
-    // policies are left as they are.
-    virtual void RemoveUplink(const std::string& nic, bool removeFromPolicies) = 0;
+    // Throws for a NIC that is not an uplink of this switch. The failover
+    // policies of the switch and its port groups keep naming the NIC:
+    // changing them is a step of its own.
+    virtual void RemoveUplink(const std::string& nic) = 0;
 
     // The failover policy shown as the switch's, and the one that is edited
     // and written back (for a standard switch the same policy).

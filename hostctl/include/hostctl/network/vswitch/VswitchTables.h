@@ -7,12 +7,27 @@
 #include <cstdint>
 #include <string>
 
+#include "hostctl/network/vswitch/Policy.h"
+
 namespace HostCtl {
 namespace Network {
 
 // The CDP status words of a standard switch. A word's position is the index
 // VirtualSwitch::SetCDPStatus takes.
 inline constexpr std::array<const char*, 4> kCdpStatusWords = {"down", "listen", "advertise", "both"};
+
+// The load-balancing words of failover policies: what the host stores and
+// what the commands show and take.
+struct LoadBalancingWord {
+    TeamPolicyType type;
+    const char* word;
+};
+inline constexpr std::array<LoadBalancingWord, 4> kLoadBalancingWords = {{
+    {TEAM_IP_HASH, "iphash"},
+    {TEAM_SRC_MAC, "srcmac"},
+    {TEAM_PORT_ID, "srcport"},
+    {TEAM_EXPLICIT, "explicit"},
+}};
 
 // The ports all switches of a host may have together, unless the host's
 // system settings say otherwise ("maxPorts").

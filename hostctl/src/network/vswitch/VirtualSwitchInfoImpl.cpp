@@ -1,0 +1,111 @@
+// The host's standard switches: listing, finding, adding and removing them.
+#include "hostctl/Lib.h"
+#include "hostctl/network/vswitch/SwitchImpl.h"
+#include "hostctl/network/vswitch/VswitchTables.h"
+#include "network/NetworkRecords.h"
+#include "network/dvs/DvsRecords.h"
+#include "network/vswitch/VswitchLookup.h"
+
+namespace PldCtl {
+namespace Network {
+
+using HostCtl::Network::VirtualSwitch;
+
+VirtualSwitchInfoImpl::VirtualSwitchInfoImpl() = default;
+
+VirtualSwitchInfoImpl::~VirtualSwitchInfoImpl() = default;
+
+std::vector<std::unique_ptr<VirtualSwitch>> VirtualSwitchInfoImpl::GetVirtualSwitches() {
+    Store::HostStore& store = Detail::EnterOperation("VirtualSwitchInfoImpl::GetVirtualSwitches");
+    // One pass over each collection for all switches, instead of a few
+    // queries per switch: listing a thousand switches stays quick.
+    std::vector<std::unique_ptr<VirtualSwitch>> switches;
+    store.Read([&](Transaction& t) {
+        const auto ports =
+            t.CountGroups(PortRecord::kSection, std::string(), {FieldTest{PortRecord::kClientField, std::nullopt}});
+        Detail::PortGroupsBySwitch portGroups = Detail::ListPortGroupsBySwitch(t);
+        for (auto& vswitch : Detail::DecodeShared<VswitchRecord>(t.ListText(VswitchRecord::kSection))) {
+            auto counted = ports.find(vswitch->name);
+            const std::pair<int, int> portCounts =
+                counted == ports.end()
+                    ? std::make_pair(0, 0)
+                    : std::make_pair(static_cast<int>(counted->second.all), static_cast<int>(counted->second.passing));
+            auto own = portGroups.find(vswitch->name);
+            std::vector<std::shared_ptr<const PortGroupRecord>> ownPortGroups;
+            if (own != portGroups.end()) ownPortGroups = std::move(own->second);
+            switches.push_back(
+                std::make_unique<VirtualSwitchImpl>(std::move(vswitch), portCounts, std::move(ownPortGroups)));
+        }
+    });
+    return switches;
+}
+
+std::unique_ptr<VirtualSwitch> VirtualSwitchInfoImpl::GetVirtualSwitchByName(const std::string& name) {
+    Store::HostStore& store = Detail::EnterOperation("VirtualSwitchInfoImpl::GetVirtualSwitchByName", name);
+    std::optional<VswitchRecord> vswitch = Detail::Get<VswitchRecord>(store, name);
+    if (!vswitch) return nullptr;
+    return std::make_unique<VirtualSwitchImpl>(std::make_shared<const VswitchRecord>(std::move(*vswitch)));
+}
+
+std::unique_ptr<VirtualSwitch> VirtualSwitchInfoImpl::AddVirtualSwitchWithPolicy(
+    const NicTeamingPolicy& teaming, const PortSecurityPolicy& security, const ShapingPolicy& shaping,
+    const HostCtl::Network::NicCapabilities& capabilities, const std::string& name, long long numPorts) {
+    using HostCtl::Network::Portset;
+    Detail::CheckSwitchName(name);
+    if (numPorts < 1 || numPorts > Portset::MAX_NUM_PORTS) {
+        throw HostCtlException("Invalid number of ports " + std::to_string(numPorts) + ": a virtual switch has 1 to " +
+                               std::to_string(Portset::MAX_NUM_PORTS) + " ports");
+    }
+    VswitchRecord created;
+    created.name = name;
+    created.numPorts = static_cast<int>(numPorts);
+    created.teaming = Detail::FromPolicy(NicTeamingPolicy::GetDefaultPolicy().OverlaidWith(teaming));
+    created.security = Detail::FromPolicy(PortSecurityPolicy::GetDefaultPolicy().OverlaidWith(security));
+    created.shaping = Detail::FromPolicy(ShapingPolicy::GetDefaultPolicy().OverlaidWith(shaping));
+    created.capabilities.checksumOffload = capabilities.GetChecksumOffload();
+    created.capabilities.segmentationOffload = capabilities.GetSegmentationOffload();
+    created.capabilities.vlanTagging = capabilities.GetVlanTagging();
+    Store::HostStore& store = Detail::EnterOperation("VirtualSwitchInfoImpl::AddVirtualSwitchWithPolicy", name);
+    store.Change([&](Transaction& t) {
+        if (t.Exists(VswitchRecord::kSection, name) || t.Exists(Detail::DvSwitchRecord::kSection, name)) {
+            throw HostCtlException("A virtual switch with the name " + name + " already exists");
+        }
+        const std::int64_t limit = Detail::GetSingleton<Detail::SystemRecord>(t).maxPorts;
+        // A switch that does not store its number of ports has the default.
+        const std::int64_t allocated =
+            t.SumField(VswitchRecord::kSection, VswitchRecord::kNumPortsField, Portset::DEF_NUM_PORTS) +
+            t.SumField(Detail::DvSwitchRecord::kSection, Detail::DvSwitchRecord::kNumPortsField,
+                       Portset::DEF_NUM_PORTS);
+        if (allocated + numPorts > limit) {
+            throw HostCtlException("Unable to create virtual switch " + name + " with " + std::to_string(numPorts) +
+                                   (numPorts == 1 ? " port: " : " ports: ") + std::to_string(allocated) +
+                                   " of the host's " + std::to_string(limit) + " ports are allocated already");
+        }
+        Detail::Create(t, created);
+    });
+    return std::make_unique<VirtualSwitchImpl>(std::make_shared<const VswitchRecord>(std::move(created)));
+}
+
+void VirtualSwitchInfoImpl::RemoveVirtualSwitch(const std::string& name) {
+    Store::HostStore& store = Detail::EnterOperation("VirtualSwitchInfoImpl::RemoveVirtualSwitch", name);
+    store.Change([&](Transaction& t) {
+        const VswitchRecord vswitch = Detail::Require<VswitchRecord>(t, name).record;
+        const FieldTest withClient{PortRecord::kClientField, std::nullopt};
+        const std::int64_t used = t.CountChildren(PortRecord::kSection, name, {withClient});
+        const std::int64_t uplinksUsed = t.CountChildren(
+            PortRecord::kSection, name, {withClient, FieldTest{PortRecord::kTypeField, PortRecord::kUplinkType}});
+        if (used > uplinksUsed) {
+            throw HostCtlException("Unable to remove virtual switch " + name + ": its ports are in use by " +
+                                   Detail::ClientsOf(t, name, [](const PortRecord& port) {
+                                       return port.type != PortRecord::kUplinkType;
+                                   }));
+        }
+        for (const std::string& nic : vswitch.uplinks) Detail::ReleaseNic(t, nic);
+        t.RemoveChildren(PortRecord::kSection, name);
+        t.RemoveChildren(PortGroupRecord::kSection, name);
+        t.Remove(VswitchRecord::kSection, name);
+    });
+}
+
+}  // namespace Network
+}  // namespace PldCtl

@@ -1,0 +1,81 @@
+#include "network/vswitch/VswitchLookup.h"
+
+#include <algorithm>
+#include <cctype>
+
+#include "hostctl/Lib.h"
+#include "hostctl/network/vswitch/VswitchTables.h"
+#include "network/nic/NicRecords.h"
+
+namespace PldCtl {
+namespace Detail {
+
+using HostCtl::Lib::HostCtlException;
+
+namespace {
+
+constexpr std::size_t kMaxSwitchNameLength = 32;
+constexpr std::size_t kMaxPortGroupNameLength = 64;
+
+std::string MissingMessage(const VswitchRecord&, const std::string& name) {
+    return HostCtl::Network::UnknownVirtualSwitchMessage(name);
+}
+
+std::string MissingMessage(const PortGroupRecord&, const std::string& name) {
+    return HostCtl::Network::UnknownPortGroupMessage(name);
+}
+
+}  // namespace
+
+template <typename Record>
+StoredObject<Record> Require(Store::Transaction& t, const std::string& name) {
+    std::optional<StoredObject<Record>> stored = Find<Record>(t, name);
+    if (!stored) throw HostCtlException(MissingMessage(Record(), name));
+    return std::move(*stored);
+}
+
+template StoredObject<VswitchRecord> Require<VswitchRecord>(Store::Transaction&, const std::string&);
+template StoredObject<PortGroupRecord> Require<PortGroupRecord>(Store::Transaction&, const std::string&);
+
+// Switch names are short words; they name tables' rows and appear in other
+// objects, so no blanks or separators.
+void CheckSwitchName(const std::string& name) {
+    const bool fits = !name.empty() && name.size() <= kMaxSwitchNameLength &&
+                      std::all_of(name.begin(), name.end(),
+                                  [](unsigned char c) { return std::isalnum(c) || c == '-' || c == '_' || c == '.'; });
+    if (!fits) {
+        throw HostCtlException("Invalid virtual switch name '" + name + "': use 1 to " +
+                               std::to_string(kMaxSwitchNameLength) + " letters, digits, '.', '-' or '_'");
+    }
+}
+
+// Port group names may hold blanks ("VM Network") but no control characters.
+void CheckPortGroupName(const std::string& name) {
+    const bool fits = !name.empty() && name.size() <= kMaxPortGroupNameLength && name.front() != ' ' &&
+                      name.back() != ' ' &&
+                      std::none_of(name.begin(), name.end(), [](unsigned char c) { return c < 0x20 || c == 0x7f; });
+    if (!fits) {
+        throw HostCtlException("Invalid port group name '" + name + "': use 1 to " +
+                               std::to_string(kMaxPortGroupNameLength) +
+                               " printable characters, not beginning or ending with a blank");
+    }
+}
+
+PortGroupsBySwitch ListPortGroupsBySwitch(Store::Transaction& t) {
+    PortGroupsBySwitch bySwitch;
+    for (auto& portGroup : DecodeShared<PortGroupRecord>(t.ListText(PortGroupRecord::kSection))) {
+        bySwitch[portGroup->vswitch].push_back(std::move(portGroup));
+    }
+    return bySwitch;
+}
+
+void ReleaseNic(Store::Transaction& t, const std::string& nic) {
+    if (std::optional<StoredObject<NicRecord>> stored = Find<NicRecord>(t, nic)) {
+        NicRecord released = stored->record;
+        released.uplinkPortId = 0;
+        Write(t, *stored, released);
+    }
+}
+
+}  // namespace Detail
+}  // namespace PldCtl
