@@ -25,7 +25,7 @@ std::string Mac(int a, int b) {
 }
 
 Json Teaming(const Json& order) {
-    return {{"loadBalancing", "srcport"}, {"beacon", false},     {"notifySwitches", true},
+    return {{"loadBalancing", "srcport"},  {"beacon", false},      {"notifySwitches", true},
             {"rollingRestoration", false}, {"uplinkOrder", order}, {"maxActive", 1}};
 }
 
@@ -56,20 +56,17 @@ int main() {
         const std::string name = "vSwitch" + std::to_string(s);
         const int numPorts = kPorts / kSwitches + (s < kPorts % kSwitches ? 1 : 0);
         const Json uplinks = s < kNics ? Json::array({"hwnic" + std::to_string(s)}) : Json::array();
-        vswitches.push_back({{"name", name},
-                             {"numPorts", numPorts},
-                             {"mtu", 1500},
-                             {"cdp", "listen"},
-                             {"beacon", {{"interval", 1}, {"threshold", 3}}},
-                             {"uplinks", uplinks},
-                             {"teaming", Teaming(uplinks)},
-                             {"security",
-                              {{"allowPromiscuous", false}, {"allowMacChange", true}, {"allowForgedTransmits", true}}},
-                             {"shaping",
-                              {{"enabled", false},
-                               {"averageBps", 100000000},
-                               {"peakBps", 100000000},
-                               {"burstBytes", 104857600}}}});
+        vswitches.push_back(
+            {{"name", name},
+             {"numPorts", numPorts},
+             {"mtu", 1500},
+             {"cdp", "listen"},
+             {"beacon", {{"interval", 1}, {"threshold", 3}}},
+             {"uplinks", uplinks},
+             {"teaming", Teaming(uplinks)},
+             {"security", {{"allowPromiscuous", false}, {"allowMacChange", true}, {"allowForgedTransmits", true}}},
+             {"shaping",
+              {{"enabled", false}, {"averageBps", 100000000}, {"peakBps", 100000000}, {"burstBytes", 104857600}}}});
         for (int g = 0; g < kPortGroupsPerSwitch; ++g) {
             Json pg = {{"name", name + "-pg" + std::to_string(g)}, {"vswitch", name}, {"vlanId", (s * 2 + g) % 4095}};
             if (g == 1) pg["security"] = {{"allowPromiscuous", true}};
@@ -131,7 +128,8 @@ int main() {
     profile["nics"] = nics;
     profile["vswitches"] = vswitches;
     profile["portgroups"] = portgroups;
-    profile["netstacks"] = Json::array({{{"key", "defaultTcpipStack"}, {"name", "defaultTcpipStack"}, {"state", 4660}}});
+    profile["netstacks"] =
+        Json::array({{{"key", "defaultTcpipStack"}, {"name", "defaultTcpipStack"}, {"state", 4660}}});
     profile["interfaces"] = interfaces;
     profile["routes"] = routes;
     profile["ports"] = ports;

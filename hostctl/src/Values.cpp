@@ -31,8 +31,7 @@ T ValueOrThrow(std::optional<T> value, const char* what, const std::string& text
 
 int CheckedPrefix(int prefixLength, int maximum, const char* family) {
     if (prefixLength < 0 || prefixLength > maximum) {
-        throw HostCtlException(std::string("Invalid ") + family + " prefix length: " +
-                               std::to_string(prefixLength));
+        throw HostCtlException(std::string("Invalid ") + family + " prefix length: " + std::to_string(prefixLength));
     }
     return prefixLength;
 }
@@ -42,8 +41,7 @@ std::optional<std::array<uint8_t, Size>> ParseWithPton(const std::string& text) 
     // inet_pton reads a C string: an embedded NUL would silently cut the
     // text short and let whatever follows it pass unchecked.
     std::array<uint8_t, Size> bytes{};
-    if (text.find('\0') != std::string::npos ||
-        inet_pton(AddressFamily, text.c_str(), bytes.data()) != 1) {
+    if (text.find('\0') != std::string::npos || inet_pton(AddressFamily, text.c_str(), bytes.data()) != 1) {
         return std::nullopt;
     }
     return bytes;
@@ -185,27 +183,37 @@ std::unique_ptr<IpAddress> IpAddress::FromString(const std::string& text) {
 
 // ---- Ipv4Address ----
 
-Ipv4Address::Ipv4Address(const std::string& text)
-    : Ipv4Address(ValueOrThrow(ParseIpv4(text), "IPv4 address", text)) {}
+Ipv4Address::Ipv4Address(const std::string& text) : Ipv4Address(ValueOrThrow(ParseIpv4(text), "IPv4 address", text)) {}
 
-bool Ipv4Address::IsValidAddress(const std::string& text) { return ParseIpv4(text).has_value(); }
+bool Ipv4Address::IsValidAddress(const std::string& text) {
+    return ParseIpv4(text).has_value();
+}
 
-std::string Ipv4Address::GetStringAddress() const { return FormatWithNtop<AF_INET>(ToBytes(value_)); }
+std::string Ipv4Address::GetStringAddress() const {
+    return FormatWithNtop<AF_INET>(ToBytes(value_));
+}
 
-std::unique_ptr<IpAddress> Ipv4Address::Clone() const { return std::make_unique<Ipv4Address>(*this); }
+std::unique_ptr<IpAddress> Ipv4Address::Clone() const {
+    return std::make_unique<Ipv4Address>(*this);
+}
 
 // ---- Ipv6Address ----
 
-Ipv6Address::Ipv6Address(const std::string& text)
-    : Ipv6Address(ValueOrThrow(ParseIpv6(text), "IPv6 address", text)) {}
+Ipv6Address::Ipv6Address(const std::string& text) : Ipv6Address(ValueOrThrow(ParseIpv6(text), "IPv6 address", text)) {}
 
-bool Ipv6Address::IsValidAddress(const std::string& text) { return ParseIpv6(text).has_value(); }
+bool Ipv6Address::IsValidAddress(const std::string& text) {
+    return ParseIpv6(text).has_value();
+}
 
 // glibc's writer follows RFC 5952 already, including the choice of the first
 // of two equally long zero runs and leaving a single zero field alone.
-std::string Ipv6Address::GetStringAddress() const { return FormatWithNtop<AF_INET6>(bytes_); }
+std::string Ipv6Address::GetStringAddress() const {
+    return FormatWithNtop<AF_INET6>(bytes_);
+}
 
-std::unique_ptr<IpAddress> Ipv6Address::Clone() const { return std::make_unique<Ipv6Address>(*this); }
+std::unique_ptr<IpAddress> Ipv6Address::Clone() const {
+    return std::make_unique<Ipv6Address>(*this);
+}
 
 // ---- Ipv4Network ----
 
@@ -219,7 +227,9 @@ bool Ipv4Network::IsValidAddressAndNetmask(const std::string& text) {
     return ParseIpv4Network(text).has_value();
 }
 
-bool Ipv4Network::IsValidNetmask(const Ipv4Address& mask) { return IsContiguousMask(mask.ToUint32()); }
+bool Ipv4Network::IsValidNetmask(const Ipv4Address& mask) {
+    return IsContiguousMask(mask.ToUint32());
+}
 
 Ipv4Address Ipv4Network::NetmaskFromNumber(int prefixLength) {
     CheckedPrefix(prefixLength, 32, "IPv4");
@@ -234,7 +244,9 @@ int Ipv4Network::PrefixFromNetmask(const Ipv4Address& mask) {
     return static_cast<int>(std::bitset<32>(mask.ToUint32()).count());
 }
 
-std::string Ipv4Network::GetStringAddress() const { return WithPrefix(address_, prefix_); }
+std::string Ipv4Network::GetStringAddress() const {
+    return WithPrefix(address_, prefix_);
+}
 
 Ipv4Network Ipv4Network::Masked() const {
     return Ipv4Network(Ipv4Address(address_.ToUint32() & GetNetmask().ToUint32()), prefix_);
@@ -270,7 +282,9 @@ Ipv6Address Ipv6Network::NetmaskFromNumber(int prefixLength) {
     return Ipv6Address(mask);
 }
 
-std::string Ipv6Network::GetStringAddress() const { return WithPrefix(address_, prefix_); }
+std::string Ipv6Network::GetStringAddress() const {
+    return WithPrefix(address_, prefix_);
+}
 
 Ipv6Network Ipv6Network::Masked() const {
     Ipv6Address::Bytes bytes = address_.GetBytes();
@@ -295,7 +309,9 @@ bool Ipv6Network::operator<(const Ipv6Network& other) const {
 
 MacAddress::MacAddress(const std::string& text) : bytes_(ValueOrThrow(ParseMac(text), "MAC address", text)) {}
 
-bool MacAddress::IsValid(const std::string& text) { return ParseMac(text).has_value(); }
+bool MacAddress::IsValid(const std::string& text) {
+    return ParseMac(text).has_value();
+}
 
 std::string MacAddress::GetStringAddress() const {
     static const char digits[] = "0123456789abcdef";

@@ -9,6 +9,7 @@
 // left untouched and no partial tree is ever visible.
 #include <boost/shared_ptr.hpp>
 
+#include "framework/AutoCli.h"
 #include "ip/IpGet.h"
 #include "ip/IpSet.h"
 #include "vswitch/VirtualSwitchPortGroupAdd.h"
@@ -33,7 +34,6 @@
 #include "vswitch/VirtualSwitchStandardSet.h"
 #include "vswitch/VirtualSwitchStandardUplinkAdd.h"
 #include "vswitch/VirtualSwitchStandardUplinkRemove.h"
-#include "framework/AutoCli.h"
 
 namespace {
 

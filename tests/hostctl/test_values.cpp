@@ -11,11 +11,21 @@
 namespace HostCtl {
 namespace Network {
 // Failure messages show the values as text rather than as raw bytes.
-void PrintTo(const Ipv4Address& value, std::ostream* out) { *out << value.GetStringAddress(); }
-void PrintTo(const Ipv6Address& value, std::ostream* out) { *out << value.GetStringAddress(); }
-void PrintTo(const Ipv4Network& value, std::ostream* out) { *out << value.GetStringAddress(); }
-void PrintTo(const Ipv6Network& value, std::ostream* out) { *out << value.GetStringAddress(); }
-void PrintTo(const MacAddress& value, std::ostream* out) { *out << value.GetStringAddress(); }
+void PrintTo(const Ipv4Address& value, std::ostream* out) {
+    *out << value.GetStringAddress();
+}
+void PrintTo(const Ipv6Address& value, std::ostream* out) {
+    *out << value.GetStringAddress();
+}
+void PrintTo(const Ipv4Network& value, std::ostream* out) {
+    *out << value.GetStringAddress();
+}
+void PrintTo(const Ipv6Network& value, std::ostream* out) {
+    *out << value.GetStringAddress();
+}
+void PrintTo(const MacAddress& value, std::ostream* out) {
+    *out << value.GetStringAddress();
+}
 }  // namespace Network
 }  // namespace HostCtl
 
@@ -48,8 +58,14 @@ void ExpectRefused(bool (*isValid)(const std::string&), const std::string& what,
 }
 
 TEST(Ipv4AddressTest, ParsesStrictDottedQuadsOnly) {
-    const struct { const char* text; uint32_t value; } valid[] = {
-        {"0.0.0.0", 0}, {"255.255.255.255", 0xffffffff}, {"192.0.2.1", 0xc0000201}, {"10.0.0.10", 0x0a00000a},
+    const struct {
+        const char* text;
+        uint32_t value;
+    } valid[] = {
+        {"0.0.0.0", 0},
+        {"255.255.255.255", 0xffffffff},
+        {"192.0.2.1", 0xc0000201},
+        {"10.0.0.10", 0x0a00000a},
     };
     for (const auto& c : valid) {
         EXPECT_TRUE(Ipv4Address::IsValidAddress(c.text)) << c.text;
@@ -58,10 +74,10 @@ TEST(Ipv4AddressTest, ParsesStrictDottedQuadsOnly) {
         EXPECT_EQ(address.GetStringAddress(), c.text);
         EXPECT_EQ(Ipv4Address(c.value), address);
     }
-    ExpectRefused<Ipv4Address>(Ipv4Address::IsValidAddress, "IPv4 address",
-                               {"", "1.2.3", "1.2.3.4.5", "256.0.0.1", "1.2.3.300", "01.2.3.4", "1.2.3.04",
-                                "1.2.3.00", " 1.2.3.4", "1.2.3.4 ", "1. 2.3.4", "0x1.2.3.4", "1.2.3.-4",
-                                "1..3.4", "1.2.3.4.", "1.2.3.4/24", "16909060", "::1", "1.2.3.4\0.5"s});
+    ExpectRefused<Ipv4Address>(
+        Ipv4Address::IsValidAddress, "IPv4 address",
+        {"", "1.2.3", "1.2.3.4.5", "256.0.0.1", "1.2.3.300", "01.2.3.4", "1.2.3.04", "1.2.3.00", " 1.2.3.4", "1.2.3.4 ",
+         "1. 2.3.4", "0x1.2.3.4", "1.2.3.-4", "1..3.4", "1.2.3.4.", "1.2.3.4/24", "16909060", "::1", "1.2.3.4\0.5"s});
 }
 
 TEST(Ipv4AddressTest, UnsetOrderAndPolymorphism) {
@@ -94,7 +110,10 @@ TEST(Ipv4AddressTest, UnsetOrderAndPolymorphism) {
 }
 
 TEST(Ipv6AddressTest, PrintsTheCanonicalForm) {
-    const struct { const char* text; const char* canonical; } cases[] = {
+    const struct {
+        const char* text;
+        const char* canonical;
+    } cases[] = {
         {"2001:0db8:0000:0000:0000:0000:0000:0001", "2001:db8::1"},  // leading zeros, one long run
         {"2001:DB8::AbCd", "2001:db8::abcd"},                        // lower case
         {"2001:db8:0:0:1:0:0:1", "2001:db8::1:0:0:1"},               // first of two equal runs
@@ -114,10 +133,10 @@ TEST(Ipv6AddressTest, PrintsTheCanonicalForm) {
         EXPECT_EQ(address.GetStringAddress(), c.canonical) << c.text;
         EXPECT_EQ(Ipv6Address(address.GetStringAddress()), address) << c.text;
     }
-    ExpectRefused<Ipv6Address>(Ipv6Address::IsValidAddress, "IPv6 address",
-                               {"", ":", ":::", "1::2::3", "12345::", "1:2:3:4:5:6:7:8:9", "1:2:3:4:5:6:7",
-                                "2001:db8::g", "fe80::1%eth0", " ::1", "::1 ", "[::1]", "192.0.2.1",
-                                "::ffff:01.2.3.4", "::1/128", "::1\0:2"s});
+    ExpectRefused<Ipv6Address>(
+        Ipv6Address::IsValidAddress, "IPv6 address",
+        {"", ":", ":::", "1::2::3", "12345::", "1:2:3:4:5:6:7:8:9", "1:2:3:4:5:6:7", "2001:db8::g", "fe80::1%eth0",
+         " ::1", "::1 ", "[::1]", "192.0.2.1", "::ffff:01.2.3.4", "::1/128", "::1\0:2"s});
 }
 
 TEST(Ipv6AddressTest, BytesAndHelpers) {
@@ -139,7 +158,13 @@ TEST(Ipv6AddressTest, BytesAndHelpers) {
 }
 
 TEST(Ipv4NetworkTest, ParsesPrefixesAndNetmasks) {
-    const struct { const char* text; const char* address; const char* mask; int prefix; const char* printed; } valid[] = {
+    const struct {
+        const char* text;
+        const char* address;
+        const char* mask;
+        int prefix;
+        const char* printed;
+    } valid[] = {
         {"192.0.2.0/24", "192.0.2.0", "255.255.255.0", 24, "192.0.2.0/24"},
         {"192.0.2.77/32", "192.0.2.77", "255.255.255.255", 32, "192.0.2.77/32"},
         {"0.0.0.0/0", "0.0.0.0", "0.0.0.0", 0, "0.0.0.0/0"},
@@ -156,11 +181,11 @@ TEST(Ipv4NetworkTest, ParsesPrefixesAndNetmasks) {
         EXPECT_EQ(network.GetStringAddress(), c.printed);
         EXPECT_EQ(Ipv4Network(network.GetStringAddress()), network);
     }
-    ExpectRefused<Ipv4Network>(Ipv4Network::IsValidAddressAndNetmask, "IPv4 network",
-                               {"", "/", "192.0.2.0", "192.0.2.0/", "/24", "192.0.2.0/33", "192.0.2.0/024",
-                                "192.0.2.0/00", "192.0.2.0/+24", "192.0.2.0/-1", "192.0.2.0/ 24", "192.0.2.0/24 ",
-                                "192.0.2.0 /24", "192.0.2.0/255.0.255.0", "192.0.2.0/0.255.255.255",
-                                "192.0.2.0/24/1", "192.0.2.256/24", "2001:db8::/32", "192.0.2.0/1000"});
+    ExpectRefused<Ipv4Network>(
+        Ipv4Network::IsValidAddressAndNetmask, "IPv4 network",
+        {"", "/", "192.0.2.0", "192.0.2.0/", "/24", "192.0.2.0/33", "192.0.2.0/024", "192.0.2.0/00", "192.0.2.0/+24",
+         "192.0.2.0/-1", "192.0.2.0/ 24", "192.0.2.0/24 ", "192.0.2.0 /24", "192.0.2.0/255.0.255.0",
+         "192.0.2.0/0.255.255.255", "192.0.2.0/24/1", "192.0.2.256/24", "2001:db8::/32", "192.0.2.0/1000"});
     EXPECT_THROW(Ipv4Network(Ipv4Address("192.0.2.0"), 33), HostCtlException);
     EXPECT_THROW(Ipv4Network(Ipv4Address("192.0.2.0"), -1), HostCtlException);
 }
@@ -199,7 +224,12 @@ TEST(Ipv4NetworkTest, NetmaskConversionsMaskingAndOrder) {
 }
 
 TEST(Ipv6NetworkTest, ParsesAndPrints) {
-    const struct { const char* text; const char* address; int prefix; const char* printed; } valid[] = {
+    const struct {
+        const char* text;
+        const char* address;
+        int prefix;
+        const char* printed;
+    } valid[] = {
         {"2001:db8::/32", "2001:db8::", 32, "2001:db8::/32"},
         {"2001:DB8:0:0::1/64", "2001:db8::1", 64, "2001:db8::1/64"},
         {"::/0", "::", 0, "::/0"},
@@ -214,15 +244,18 @@ TEST(Ipv6NetworkTest, ParsesAndPrints) {
         EXPECT_EQ(network.GetStringAddress(), c.printed);
         EXPECT_EQ(Ipv6Network(network.GetStringAddress()), network);
     }
-    ExpectRefused<Ipv6Network>(Ipv6Network::IsValidAddressAndNetmask, "IPv6 network",
-                               {"", "2001:db8::", "2001:db8::/", "/64", "2001:db8::/129", "2001:db8::/064",
-                                "2001:db8::/ffff:ffff::", "fe80::1%eth0/64", "2001:db8::/64 ", "192.0.2.0/24",
-                                "2001:db8::/64/1"});
+    ExpectRefused<Ipv6Network>(
+        Ipv6Network::IsValidAddressAndNetmask, "IPv6 network",
+        {"", "2001:db8::", "2001:db8::/", "/64", "2001:db8::/129", "2001:db8::/064",
+         "2001:db8::/ffff:ffff::", "fe80::1%eth0/64", "2001:db8::/64 ", "192.0.2.0/24", "2001:db8::/64/1"});
     EXPECT_THROW(Ipv6Network(Ipv6Address("2001:db8::"), 129), HostCtlException);
 }
 
 TEST(Ipv6NetworkTest, NetmasksMaskingAndIdentity) {
-    const struct { int prefix; const char* mask; } masks[] = {
+    const struct {
+        int prefix;
+        const char* mask;
+    } masks[] = {
         {0, "::"},
         {1, "8000::"},
         {10, "ffc0::"},
@@ -273,11 +306,11 @@ TEST(MacAddressTest, FormsBytesAndOrder) {
     EXPECT_LT(MacAddress("00:50:56:aa:0b:1c"), MacAddress("00:50:56:aa:0c:00"));
     EXPECT_NE(MacAddress("00:50:56:aa:0b:1c"), MacAddress("00:50:56:aa:0b:1d"));
 
-    ExpectRefused<MacAddress>(MacAddress::IsValid, "MAC address",
-                              {"", "00:50:56:aa:0b", "00:50:56:aa:0b:1c:00", "0:50:56:aa:0b:1c0",
-                               "000:50:56:aa:0b:1", "00:50-56:aa:0b:1c", "00:50:56:aa:0b-1c", "00.50.56.aa.0b.1c",
-                               "0g:50:56:aa:0b:1c", "00:50:56:aa:0b:1c ", " 0:50:56:aa:0b:1c", "00:50:56:aa:0b:+c",
-                               "005056aa0b1c", "0050.56aa.0b1c", "00:50:56:aa:0b:\0c"s});
+    ExpectRefused<MacAddress>(
+        MacAddress::IsValid, "MAC address",
+        {"", "00:50:56:aa:0b", "00:50:56:aa:0b:1c:00", "0:50:56:aa:0b:1c0", "000:50:56:aa:0b:1", "00:50-56:aa:0b:1c",
+         "00:50:56:aa:0b-1c", "00.50.56.aa.0b.1c", "0g:50:56:aa:0b:1c", "00:50:56:aa:0b:1c ", " 0:50:56:aa:0b:1c",
+         "00:50:56:aa:0b:+c", "005056aa0b1c", "0050.56aa.0b1c", "00:50:56:aa:0b:\0c"s});
 }
 
 }  // namespace

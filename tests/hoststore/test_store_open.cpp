@@ -10,10 +10,10 @@
 
 namespace {
 
+using OrvixTest::ScopedEnv;
 using PldCtl::Store::HostStore;
 using PldCtl::Store::Json;
 using PldCtl::Store::StoreError;
-using OrvixTest::ScopedEnv;
 
 std::string OpenError(const std::string& path) {
     try {

@@ -13,10 +13,10 @@
 
 namespace {
 
-using PldCtl::Store::HostStore;
-using PldCtl::Store::Json;
 using OrvixTest::Bin;
 using OrvixTest::Process;
+using PldCtl::Store::HostStore;
+using PldCtl::Store::Json;
 
 // The counter the stress program keeps in the "system" singleton.
 std::int64_t Counter(HostStore& store) {

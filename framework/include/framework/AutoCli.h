@@ -63,9 +63,7 @@ public:
 
     void SetMetaDataField(const std::string& key, const std::string& value) { metaData_[key] = value; }
     void SetDefaultOutputFormatter(const std::string& name) { defaultFormatter_ = name; }
-    void SetDefaultOutputParameter(const std::string& key, const std::string& value) {
-        outputParameters_[key] = value;
-    }
+    void SetDefaultOutputParameter(const std::string& key, const std::string& value) { outputParameters_[key] = value; }
 
     // "" when the key was never set.
     std::string GetMetaDataField(const std::string& key) const;

@@ -16,10 +16,10 @@ namespace AutoCli {
 
 // Exit statuses, the one table every run maps its outcome to.
 enum ExitStatus {
-    kExitOk = 0,             // success
+    kExitOk = 0,            // success
     kExitCommandError = 1,  // the command reported an error (its messages on stderr)
-    kExitUsage = 2,          // the command line was wrong (unknown command/option, bad value, ...)
-    kExitFailure = 3,        // the host or the tool itself failed (e.g. the host store cannot be opened)
+    kExitUsage = 2,         // the command line was wrong (unknown command/option, bad value, ...)
+    kExitFailure = 3,       // the host or the tool itself failed (e.g. the host store cannot be opened)
 };
 
 // A command line the framework refuses before the command runs.
@@ -47,8 +47,7 @@ std::string SuggestClosest(const std::string& word, const std::vector<std::strin
 // Help texts. `path` is the command path as typed ("network ip set").
 void RenderNamespaceHelp(const NamespaceNode& node, const std::string& program, const std::string& path,
                          std::ostream& out);
-void RenderCommandHelp(Command& command, const std::string& program, const std::string& path,
-                       std::ostream& out);
+void RenderCommandHelp(Command& command, const std::string& program, const std::string& path, std::ostream& out);
 // A parameter description with %ENUM% and %FULLENUM% expanded from its
 // constraint: %ENUM% by the values joined with ", ", %FULLENUM% by one line
 // per value ("value: description", or the value alone without description).

@@ -79,8 +79,7 @@ void KeepOldStandby(const NicTeamingPolicy& reference, std::vector<std::string>&
 // adapters inside the active part.
 void KeepOldActive(const NicTeamingPolicy& reference, NicTeamingPolicy& policy, std::vector<std::string>& order) {
     std::vector<std::string> kept = reference.GetUplinkOrder();
-    std::size_t active =
-        std::min(static_cast<std::size_t>(std::max(reference.GetMaxActiveUplinks(), 0)), kept.size());
+    std::size_t active = std::min(static_cast<std::size_t>(std::max(reference.GetMaxActiveUplinks(), 0)), kept.size());
     for (std::size_t i = 0; i < active;) {
         if (Contains(order, kept[i])) {
             kept.erase(kept.begin() + static_cast<std::ptrdiff_t>(i));

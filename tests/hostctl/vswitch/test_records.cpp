@@ -9,7 +9,6 @@
 
 namespace {
 
-
 class Records : public FreshHost {
 protected:
     void MakeHost(const std::string& sections) {
@@ -133,7 +132,8 @@ TEST_F(Records, TextIsReadExactlyAndDamagedTextFailsCleanly) {
         }
     };
     const std::string deep = std::string(1900, '[') + std::string(1900, ']');
-    ASSERT_TRUE(store(R"({"junk": )" + deep + R"(, "name": "r\u0061w \ud83d\ude80", "vswitch": "vSwitch0", "vlanId": 5})"));
+    ASSERT_TRUE(
+        store(R"({"junk": )" + deep + R"(, "name": "r\u0061w \ud83d\ude80", "vswitch": "vSwitch0", "vlanId": 5})"));
     auto raw = NetworkFactory::GetPortGroupByName("raw");
     EXPECT_EQ(raw->GetName(), "raw \xf0\x9f\x9a\x80");
     EXPECT_EQ(raw->GetVlanId(), 5);

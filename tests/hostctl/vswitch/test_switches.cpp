@@ -68,7 +68,8 @@ TEST_F(Switches, TheLibraryChecksWhatTheCommandsCheckFirst) {
               "Invalid failover policy for virtual switch vSwitch0: an uplink appears more than once in its order");
 
     // A refused change leaves the snapshot as it was.
-    HostSim({"fault", "add", "VirtualSwitchImpl::SetMTU", "--key", "vSwitch1", "--message", "MTU change refused", "--count", "1"});
+    HostSim({"fault", "add", "VirtualSwitchImpl::SetMTU", "--key", "vSwitch1", "--message", "MTU change refused",
+             "--count", "1"});
     auto vSwitch1 = Switch("vSwitch1");
     EXPECT_EQ(MessageOf([&] { vSwitch1->SetMTU(1500); }), "MTU change refused");
     EXPECT_EQ(vSwitch1->GetMTU(), 9000);

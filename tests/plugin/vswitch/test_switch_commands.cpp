@@ -11,8 +11,8 @@
 
 #include <gtest/gtest.h>
 
-#include "hostctl/network/NetworkFactory.h"
 #include "hostctl/HostSession.h"
+#include "hostctl/network/NetworkFactory.h"
 #include "support/test_util.h"
 #include "vswitch/VirtualSwitchStandardList.h"
 #include "vswitch/VirtualSwitchStandardSet.h"

@@ -1,7 +1,6 @@
 // The host-control library's interface of one kernel IP interface.
 #pragma once
 
-
 namespace HostCtl {
 namespace Network {
 
