@@ -4,6 +4,7 @@
 #include <iterator>
 
 #include "framework/Format.h"
+#include "hostctl/network/vswitch/VswitchTables.h"
 
 namespace OrvixCli {
 namespace NetworkNamespace {
@@ -65,16 +66,10 @@ const std::vector<std::string>& OverriddenSettings(PolicyKind kind) {
     return kind == PolicyKind::Failover ? kFailoverOverridden : ValueFields(kind);
 }
 
+// The word a failover policy's load balancing is shown with: the host's own.
 const char* LoadBalancingWord(HostCtl::Network::TeamPolicyType type) {
-    switch (type) {
-        case HostCtl::Network::TEAM_IP_HASH:
-            return "iphash";
-        case HostCtl::Network::TEAM_SRC_MAC:
-            return "srcmac";
-        case HostCtl::Network::TEAM_PORT_ID:
-            return "srcport";
-        case HostCtl::Network::TEAM_EXPLICIT:
-            return "explicit";
+    for (const auto& entry : HostCtl::Network::kLoadBalancingWords) {
+        if (entry.type == type) return entry.word;
     }
     return "unknown";
 }

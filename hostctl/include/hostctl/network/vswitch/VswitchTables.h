@@ -16,8 +16,9 @@ namespace Network {
 // VirtualSwitch::SetCDPStatus takes.
 inline constexpr std::array<const char*, 4> kCdpStatusWords = {"down", "listen", "advertise", "both"};
 
-// The load-balancing words of failover policies: what the host stores and
-// what the commands show and take.
+// The load-balancing words of failover policies, as the host stores them
+// and the policy commands show them. (The set commands take words of their
+// own, "portid" and "mac" among them, and map them to these types.)
 struct LoadBalancingWord {
     TeamPolicyType type;
     const char* word;
