@@ -2,6 +2,7 @@
 
 #include <limits>
 #include <stdexcept>
+#include <utility>
 
 #include <boost/make_shared.hpp>
 
@@ -38,6 +39,13 @@ boost::shared_ptr<MetaString> MetaString::New() {
 boost::shared_ptr<MetaString> MetaString::New(const std::string& value) {
     boost::shared_ptr<MetaString> s = boost::make_shared<MetaString>(Token());
     s->value_ = value;
+    s->hasValue_ = true;
+    return s;
+}
+
+boost::shared_ptr<MetaString> MetaString::New(std::string&& value) {
+    boost::shared_ptr<MetaString> s = boost::make_shared<MetaString>(Token());
+    s->value_ = std::move(value);
     s->hasValue_ = true;
     return s;
 }
@@ -80,53 +88,68 @@ boost::shared_ptr<MetaStruct> MetaStruct::New(const std::string& typeName) {
     return boost::make_shared<MetaStruct>(Token(), typeName);
 }
 
-void MetaStruct::SetField(const std::string& name, const MetaObjectPtr& value) {
-    if (!value) {
-        throw std::invalid_argument("MetaStruct::SetField: null value for field '" + name + "'");
-    }
+void MetaStruct::Put(const std::string& name, MetaObjectPtr&& value) {
     for (auto& field : fields_) {
         if (field.first == name) {
-            field.second = value;
+            field.second = std::move(value);
             return;
         }
     }
     // Room for a typical record at once, instead of growing one field at a
     // time: listings make thousands of records.
     if (fields_.empty()) fields_.reserve(kTypicalFieldCount);
-    fields_.emplace_back(name, value);
+    fields_.emplace_back(name, std::move(value));
+}
+
+void MetaStruct::SetField(const std::string& name, const MetaObjectPtr& value) {
+    SetField(name, MetaObjectPtr(value));
+}
+
+void MetaStruct::SetField(const std::string& name, MetaObjectPtr&& value) {
+    if (!value) {
+        throw std::invalid_argument("MetaStruct::SetField: null value for field '" + name + "'");
+    }
+    Put(name, std::move(value));
 }
 
 void MetaStruct::SetField(const std::string& name, const std::string& value) {
-    SetField(name, MetaString::New(value));
+    Put(name, MetaString::New(value));
+}
+void MetaStruct::SetField(const std::string& name, std::string&& value) {
+    Put(name, MetaString::New(std::move(value)));
 }
 void MetaStruct::SetField(const std::string& name, const char* value) {
-    SetField(name, MetaString::New(value ? value : ""));
+    Put(name, MetaString::New(value ? value : ""));
 }
 void MetaStruct::SetField(const std::string& name, bool value) {
-    SetField(name, MetaBool::New(value));
+    Put(name, MetaBool::New(value));
 }
 void MetaStruct::SetField(const std::string& name, int value) {
-    SetField(name, MetaInt::New(value));
+    Put(name, MetaInt::New(value));
 }
 void MetaStruct::SetField(const std::string& name, long value) {
-    SetField(name, MetaInt::New(value));
+    Put(name, MetaInt::New(value));
 }
 void MetaStruct::SetField(const std::string& name, long long value) {
-    SetField(name, MetaInt::New(value));
+    Put(name, MetaInt::New(value));
 }
 void MetaStruct::SetField(const std::string& name, unsigned int value) {
-    SetField(name, MetaInt::NewUnsigned(value));
+    Put(name, MetaInt::NewUnsigned(value));
 }
 void MetaStruct::SetField(const std::string& name, unsigned long value) {
-    SetField(name, MetaInt::NewUnsigned(value));
+    Put(name, MetaInt::NewUnsigned(value));
 }
 void MetaStruct::SetField(const std::string& name, unsigned long long value) {
-    SetField(name, MetaInt::NewUnsigned(value));
+    Put(name, MetaInt::NewUnsigned(value));
 }
 void MetaStruct::SetField(const std::string& name, const std::vector<std::string>& values) {
+    SetField(name, std::vector<std::string>(values));
+}
+void MetaStruct::SetField(const std::string& name, std::vector<std::string>&& values) {
     boost::shared_ptr<MetaList> list = MetaList::New(META_STRING);
-    for (const auto& v : values) list->Append(v);
-    SetField(name, list);
+    list->Reserve(values.size());
+    for (auto& v : values) list->Append(std::move(v));
+    Put(name, std::move(list));
 }
 
 MetaObjectPtr MetaStruct::GetField(const std::string& name) const {
@@ -152,10 +175,14 @@ void MetaList::Append(const boost::shared_ptr<MetaString>& element) {
 }
 
 void MetaList::Append(const boost::shared_ptr<MetaStruct>& element) {
+    Append(boost::shared_ptr<MetaStruct>(element));
+}
+
+void MetaList::Append(boost::shared_ptr<MetaStruct>&& element) {
     if (elementType_ != META_STRUCT || !element) {
         throw std::invalid_argument("MetaList::Append: a record does not belong in this list");
     }
-    elements_.push_back(element);
+    elements_.push_back(std::move(element));
 }
 
 void MetaList::Append(const char* element) {
@@ -164,6 +191,10 @@ void MetaList::Append(const char* element) {
 
 void MetaList::Append(const std::string& element) {
     Append(MetaString::New(element));
+}
+
+void MetaList::Append(std::string&& element) {
+    Append(MetaString::New(std::move(element)));
 }
 
 }  // namespace MetaObj

@@ -138,9 +138,13 @@ int Execute(Command& command, const CommandLine& line, std::ostream& out, std::o
         }
         // Rendered to a buffer first, so a formatter failure never leaves
         // half a document on stdout.
-        std::ostringstream rendered;
+        std::stringstream rendered;
         formatter->Render(result, FormatHints(command.GetDefaultOutputParameters()), rendered);
-        out << rendered.str();
+        // Handed over from the buffer itself (hence a stream that can also be
+        // read) rather than from a copy of it: a listing renders to hundreds
+        // of kilobytes. Nothing is handed over for an empty rendering, which
+        // would otherwise mark `out` as failed.
+        if (rendered.tellp() > 0) out << rendered.rdbuf();
     }
     for (const auto& message : output->GetErrors()) err << message << "\n";
     return output->HasError() ? kExitCommandError : kExitOk;

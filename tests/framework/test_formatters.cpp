@@ -397,4 +397,71 @@ TEST(KeyValueFormatter, KeysSpellThePath) {
     EXPECT_EQ(Render("keyvalue", SwitchList({})), "");
 }
 
+// Values handed over (moved) and values copied end up the same; a field set
+// again keeps its place; the checks hold on either path.
+TEST(MetaValues, MovedAndCopiedValuesAreTheSame) {
+    std::string name = "vSwitch0";
+    std::vector<std::string> uplinks = {"hwnic0", "hwnic1", "a name longer than any short string buffer"};
+    StructPtr copied = MetaStruct::New("VirtualSwitch");
+    copied->SetField("Name", name);
+    copied->SetField("Uplinks", uplinks);
+    copied->SetField("Beacon", MetaObjectPtr(Beacon(true)));
+    StructPtr moved = MetaStruct::New("VirtualSwitch");
+    moved->SetField("Name", std::string(name));
+    moved->SetField("Uplinks", std::vector<std::string>(uplinks));
+    moved->SetField("Beacon", Beacon(true));
+    for (const auto& formatter : FormatterNames()) {
+        EXPECT_EQ(Render(formatter, moved), Render(formatter, copied)) << formatter;
+    }
+
+    moved->SetField("Name", std::string("vSwitch1"));
+    moved->SetField("Uplinks", std::vector<std::string>{});
+    ASSERT_EQ(moved->GetFields().size(), 3u);
+    EXPECT_EQ(moved->GetFields()[0].first, "Name");
+    EXPECT_EQ(Render("simple", moved, {{"fields:VirtualSwitch", "Name,Uplinks"}}), "   Name: vSwitch1\n   Uplinks: \n");
+    EXPECT_THROW(moved->SetField("Name", MetaObjectPtr()), std::invalid_argument);
+
+    boost::shared_ptr<MetaList> names = MetaList::New(MetaObj::META_STRING);
+    names->Reserve(4);
+    EXPECT_EQ(names->Size(), 0u);
+    EXPECT_THROW(names->Append(MetaStruct::New("VirtualSwitch")), std::invalid_argument);
+    names->Append(std::string("a"));
+    EXPECT_EQ(names->Size(), 1u);
+}
+
+TEST(Formatters, IntegersAtBothEndsOfTheirRange) {
+    StructPtr s = MetaStruct::New("Counters");
+    s->SetField("Lowest", std::numeric_limits<long long>::min());
+    s->SetField("Highest", std::numeric_limits<long long>::max());
+    s->SetField("Zero", 0);
+    EXPECT_EQ(Render("table", s),
+              "Lowest                Highest              Zero\n"
+              "--------------------  -------------------  ----\n"
+              "-9223372036854775808  9223372036854775807  0\n");
+}
+
+// Records of one list with their fields in other orders, or some missing:
+// the table has a column for every field any record has, in the order first
+// met, and blanks where a record has none.
+TEST(TableFormatter, RecordsWithDifferentFields) {
+    boost::shared_ptr<MetaList> list = MetaList::New(MetaObj::META_STRUCT, MetaStruct::New("Row"));
+    StructPtr first = MetaStruct::New("Row");
+    first->SetField("A", "a1");
+    first->SetField("B", "b1");
+    StructPtr second = MetaStruct::New("Row");
+    second->SetField("C", "c2");
+    second->SetField("A", "a2");
+    StructPtr third = MetaStruct::New("Row");
+    third->SetField("B", "b3");
+    third->SetField("D", MetaString::New());
+    for (const StructPtr& row : {first, second, third}) list->Append(row);
+    EXPECT_EQ(Render("table", list),
+              "A   B   C\n"
+              "--  --  --\n"
+              "a1  b1\n"
+              "a2      c2\n"
+              "    b3\n");
+    EXPECT_EQ(Render("csv", list), "A,B,C\na1,b1,\na2,,c2\n,b3,\n");
+}
+
 }  // namespace

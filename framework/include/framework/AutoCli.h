@@ -10,6 +10,7 @@
 #include <boost/shared_ptr.hpp>
 
 #include "framework/CallSpec.h"
+#include "framework/Export.h"
 
 namespace AutoCli {
 
@@ -17,7 +18,7 @@ class Command;
 
 // A node of the command tree. A node has no name of its own: its parent
 // gives it one when it attaches it. Children keep their order of attachment.
-class NamespaceNode : public boost::enable_shared_from_this<NamespaceNode> {
+class AUTOCLI_EXPORT NamespaceNode : public boost::enable_shared_from_this<NamespaceNode> {
 public:
     using Child = std::pair<std::string, boost::shared_ptr<NamespaceNode>>;
 
@@ -44,7 +45,7 @@ private:
     std::vector<Child> children_;
 };
 
-class Namespace : public virtual NamespaceNode {
+class AUTOCLI_EXPORT Namespace : public virtual NamespaceNode {
 public:
     static boost::shared_ptr<Namespace> New();
 
@@ -55,7 +56,7 @@ protected:
 // Base of every command. A command describes itself in its constructor
 // (description, metadata, default formatter and formatter hints) and
 // implements the CallTarget hooks.
-class Command : public CallSpec::CallTarget, public virtual NamespaceNode {
+class AUTOCLI_EXPORT Command : public CallSpec::CallTarget, public virtual NamespaceNode {
 public:
     ~Command() override;
 

@@ -12,6 +12,7 @@
 #include <boost/enable_shared_from_this.hpp>
 #include <boost/shared_ptr.hpp>
 
+#include "framework/Export.h"
 #include "framework/MetaObj.h"
 
 namespace CallSpec {
@@ -23,7 +24,7 @@ enum ParameterType {
     PARAM_FLAG = 3,  // takes no value
 };
 
-const char* ParameterTypeName(ParameterType type);
+AUTOCLI_EXPORT const char* ParameterTypeName(ParameterType type);
 
 enum ParameterConstraintType {
     CONSTRAINT_INT_RANGE = 1,
@@ -34,7 +35,7 @@ enum ParameterConstraintType {
 
 // A check attached to a parameter. The framework applies it before the
 // command runs and describes it in help, so the text and the check agree.
-class ParameterConstraint {
+class AUTOCLI_EXPORT ParameterConstraint {
 public:
     struct StringEnumValue {
         std::string value;
@@ -78,15 +79,16 @@ enum class Required : bool { No = false, Yes = true };
 // constraint no value could meet or no check could apply: an IntRange whose
 // min is above its max, an enum without values, a pattern that does not
 // compile.
-boost::shared_ptr<ParameterConstraint> IntRange(std::int64_t min, std::int64_t max);
-boost::shared_ptr<ParameterConstraint> IntEnum(const std::vector<std::int64_t>& values);
+AUTOCLI_EXPORT boost::shared_ptr<ParameterConstraint> IntRange(std::int64_t min, std::int64_t max);
+AUTOCLI_EXPORT boost::shared_ptr<ParameterConstraint> IntEnum(const std::vector<std::int64_t>& values);
 // The values in the order help lists them, each with its own description
 // (which %FULLENUM% shows after the value; it may be empty).
-boost::shared_ptr<ParameterConstraint> StringEnum(const std::vector<ParameterConstraint::StringEnumValue>& values);
+AUTOCLI_EXPORT boost::shared_ptr<ParameterConstraint> StringEnum(
+    const std::vector<ParameterConstraint::StringEnumValue>& values);
 // A pattern the whole value must match (ECMAScript syntax).
-boost::shared_ptr<ParameterConstraint> StringRegex(const std::string& pattern);
+AUTOCLI_EXPORT boost::shared_ptr<ParameterConstraint> StringRegex(const std::string& pattern);
 
-class ParameterSpec {
+class AUTOCLI_EXPORT ParameterSpec {
 public:
     static boost::shared_ptr<ParameterSpec> New(const std::string& name, ParameterType type);
 
@@ -115,7 +117,7 @@ private:
     boost::shared_ptr<ParameterConstraint> constraint_;
 };
 
-class InputSpec {
+class AUTOCLI_EXPORT InputSpec {
 public:
     static boost::shared_ptr<InputSpec> New();
 
@@ -131,7 +133,7 @@ private:
     std::vector<boost::shared_ptr<ParameterSpec>> parameters_;
 };
 
-class OutputSpec {
+class AUTOCLI_EXPORT OutputSpec {
 public:
     static boost::shared_ptr<OutputSpec> New();
 
@@ -146,7 +148,7 @@ private:
 // The arguments of one run, already parsed and checked. A parameter that was
 // not given reads as "", 0 or false. GetString of an int parameter returns
 // the text as the user typed it.
-class Input {
+class AUTOCLI_EXPORT Input {
 public:
     static boost::shared_ptr<Input> New();
 
@@ -174,7 +176,7 @@ private:
 
 // The outcome of one run: any number of error messages, in the order they
 // were reported, and at most one result.
-class Output {
+class AUTOCLI_EXPORT Output {
 public:
     static boost::shared_ptr<Output> New();
 
@@ -198,7 +200,7 @@ private:
 // Something the framework can call: it declares its input and output and
 // runs once per invocation. The public members are the framework's entry
 // points; the *Internal hooks are what a command implements.
-class CallTarget {
+class AUTOCLI_EXPORT CallTarget {
 public:
     virtual ~CallTarget();
 

@@ -8,6 +8,7 @@
 #include <string>
 #include <vector>
 
+#include "framework/Export.h"
 #include "framework/MetaObj.h"
 
 namespace AutoCli {
@@ -20,7 +21,7 @@ namespace AutoCli {
 //                              for every type); empty means "no restriction"
 //   "units:<Type>.<Field>"     a unit word printed after that field's value
 // Hints that name a type or field the result does not have are ignored.
-class FormatHints {
+class AUTOCLI_EXPORT FormatHints {
 public:
     FormatHints() = default;
     explicit FormatHints(const std::map<std::string, std::string>& parameters);
@@ -48,11 +49,11 @@ private:
 };
 
 // Splits "a,b,c" into its names; an empty text gives no names.
-std::vector<std::string> SplitNames(const std::string& text);
+AUTOCLI_EXPORT std::vector<std::string> SplitNames(const std::string& text);
 // The names joined by `separator`: "a, b, c" by default.
-std::string JoinNames(const std::vector<std::string>& names, const std::string& separator = ", ");
+AUTOCLI_EXPORT std::string JoinNames(const std::vector<std::string>& names, const std::string& separator = ", ");
 
-class Formatter {
+class AUTOCLI_EXPORT Formatter {
 public:
     virtual ~Formatter();
     virtual const char* Name() const = 0;
@@ -63,7 +64,7 @@ public:
 
 // The formatters by name: simple, table, json, xml, csv, keyvalue.
 // FindFormatter returns null for an unknown name.
-const Formatter* FindFormatter(const std::string& name);
-std::vector<std::string> FormatterNames();
+AUTOCLI_EXPORT const Formatter* FindFormatter(const std::string& name);
+AUTOCLI_EXPORT std::vector<std::string> FormatterNames();
 
 }  // namespace AutoCli

@@ -10,6 +10,8 @@
 #include <boost/enable_shared_from_this.hpp>
 #include <boost/shared_ptr.hpp>
 
+#include "framework/Export.h"
+
 namespace MetaObj {
 
 // The kind of a value. The numbers of string (2) and struct (3) are the ones
@@ -22,9 +24,9 @@ enum MetaType {
     META_LIST = 4,
 };
 
-const char* MetaTypeName(int type);
+AUTOCLI_EXPORT const char* MetaTypeName(int type);
 
-class MetaObject : public boost::enable_shared_from_this<MetaObject> {
+class AUTOCLI_EXPORT MetaObject : public boost::enable_shared_from_this<MetaObject> {
 public:
     virtual ~MetaObject();
     virtual MetaType GetType() const = 0;
@@ -49,11 +51,12 @@ protected:
 
 using MetaObjectPtr = boost::shared_ptr<MetaObject>;
 
-class MetaString : public MetaObject {
+class AUTOCLI_EXPORT MetaString : public MetaObject {
 public:
     explicit MetaString(Token) {}
     static boost::shared_ptr<MetaString> New();
     static boost::shared_ptr<MetaString> New(const std::string& value);
+    static boost::shared_ptr<MetaString> New(std::string&& value);
 
     MetaType GetType() const override { return META_STRING; }
     bool HasValue() const override { return hasValue_; }
@@ -66,7 +69,7 @@ private:
 
 // A 64-bit integer. Unsigned counters above the signed range are kept as
 // unsigned so that they print exactly instead of wrapping to negatives.
-class MetaInt : public MetaObject {
+class AUTOCLI_EXPORT MetaInt : public MetaObject {
 public:
     explicit MetaInt(Token) {}
     static boost::shared_ptr<MetaInt> New();
@@ -86,7 +89,7 @@ private:
     bool hasValue_ = false;
 };
 
-class MetaBool : public MetaObject {
+class AUTOCLI_EXPORT MetaBool : public MetaObject {
 public:
     explicit MetaBool(Token) {}
     static boost::shared_ptr<MetaBool> New();
@@ -103,7 +106,7 @@ private:
 
 // A record of a named type with named fields. Fields keep the order in which
 // they were first set; setting a field again replaces its value in place.
-class MetaStruct : public MetaObject {
+class AUTOCLI_EXPORT MetaStruct : public MetaObject {
 public:
     using Field = std::pair<std::string, MetaObjectPtr>;
 
@@ -114,7 +117,9 @@ public:
     const std::string& GetTypeName() const { return typeName_; }
 
     void SetField(const std::string& name, const MetaObjectPtr& value);
+    void SetField(const std::string& name, MetaObjectPtr&& value);
     void SetField(const std::string& name, const std::string& value);
+    void SetField(const std::string& name, std::string&& value);
     void SetField(const std::string& name, const char* value);
     void SetField(const std::string& name, bool value);
     void SetField(const std::string& name, int value);
@@ -124,12 +129,16 @@ public:
     void SetField(const std::string& name, unsigned long value);
     void SetField(const std::string& name, unsigned long long value);
     void SetField(const std::string& name, const std::vector<std::string>& values);
+    void SetField(const std::string& name, std::vector<std::string>&& values);
 
     // Null when the field was never set.
     MetaObjectPtr GetField(const std::string& name) const;
     const std::vector<Field>& GetFields() const { return fields_; }
 
 private:
+    // Sets a field to a value known not to be null.
+    void Put(const std::string& name, MetaObjectPtr&& value);
+
     std::string typeName_;
     std::vector<Field> fields_;
 };
@@ -137,7 +146,7 @@ private:
 // A list of strings (META_STRING) or of records (META_STRUCT). The element
 // template of a record list names the record type, so an empty list still
 // tells a formatter which columns it would have had.
-class MetaList : public MetaObject {
+class AUTOCLI_EXPORT MetaList : public MetaObject {
 public:
     static boost::shared_ptr<MetaList> New(int elementType, const MetaObjectPtr& elementTemplate = MetaObjectPtr());
 
@@ -152,8 +161,14 @@ public:
     // and throws std::invalid_argument otherwise.
     void Append(const boost::shared_ptr<MetaString>& element);
     void Append(const boost::shared_ptr<MetaStruct>& element);
+    void Append(boost::shared_ptr<MetaStruct>&& element);
     void Append(const char* element);
     void Append(const std::string& element);
+    void Append(std::string&& element);
+
+    // Makes room for `count` elements in all, for a caller that knows how
+    // many it will append.
+    void Reserve(std::size_t count) { elements_.reserve(count); }
 
     const std::vector<MetaObjectPtr>& GetElements() const { return elements_; }
     std::size_t Size() const { return elements_.size(); }

@@ -11,6 +11,7 @@
 #include <boost/shared_ptr.hpp>
 
 #include "framework/AutoCli.h"
+#include "framework/Export.h"
 
 namespace AutoCli {
 
@@ -23,7 +24,7 @@ enum ExitStatus {
 };
 
 // A command line the framework refuses before the command runs.
-class UsageError : public std::runtime_error {
+class AUTOCLI_EXPORT UsageError : public std::runtime_error {
 public:
     using std::runtime_error::runtime_error;
 };
@@ -33,25 +34,26 @@ public:
 // flags take no value; bools take true/false, 1/0, yes/no in any case; ints
 // are signed 64-bit decimal. Checks unknown, repeated and missing required
 // options, types and constraints. Throws UsageError with a one-line message.
-boost::shared_ptr<CallSpec::Input> ParseArguments(const CallSpec::InputSpec& declared,
-                                                  const std::vector<std::string>& args);
+AUTOCLI_EXPORT boost::shared_ptr<CallSpec::Input> ParseArguments(const CallSpec::InputSpec& declared,
+                                                                 const std::vector<std::string>& args);
 
 // Parses a bool word; false when the word is not one.
-bool ParseBoolWord(const std::string& text, bool& value);
+AUTOCLI_EXPORT bool ParseBoolWord(const std::string& text, bool& value);
 // Parses a signed 64-bit decimal; false on anything else (blanks, overflow).
-bool ParseInt64(const std::string& text, std::int64_t& value);
+AUTOCLI_EXPORT bool ParseInt64(const std::string& text, std::int64_t& value);
 
 // The closest of the candidates to a mistyped word, or "" when none is close.
-std::string SuggestClosest(const std::string& word, const std::vector<std::string>& candidates);
+AUTOCLI_EXPORT std::string SuggestClosest(const std::string& word, const std::vector<std::string>& candidates);
 
 // Help texts. `path` is the command path as typed ("network ip set").
-void RenderNamespaceHelp(const NamespaceNode& node, const std::string& program, const std::string& path,
-                         std::ostream& out);
-void RenderCommandHelp(Command& command, const std::string& program, const std::string& path, std::ostream& out);
+AUTOCLI_EXPORT void RenderNamespaceHelp(const NamespaceNode& node, const std::string& program, const std::string& path,
+                                        std::ostream& out);
+AUTOCLI_EXPORT void RenderCommandHelp(Command& command, const std::string& program, const std::string& path,
+                                      std::ostream& out);
 // A parameter description with %ENUM% and %FULLENUM% expanded from its
 // constraint: %ENUM% by the values joined with ", ", %FULLENUM% by one line
 // per value ("value: description", or the value alone without description).
-std::string ExpandDescription(const CallSpec::ParameterSpec& parameter, const std::string& indent);
+AUTOCLI_EXPORT std::string ExpandDescription(const CallSpec::ParameterSpec& parameter, const std::string& indent);
 
 struct RunOptions {
     std::string program = "orvixcli";
@@ -60,7 +62,7 @@ struct RunOptions {
 
 // Runs one command line. Never throws: whatever a command lets escape is
 // reported on `err` and gives kExitFailure.
-int Run(const boost::shared_ptr<NamespaceNode>& root, const std::vector<std::string>& args, std::ostream& out,
-        std::ostream& err, const RunOptions& options = RunOptions());
+AUTOCLI_EXPORT int Run(const boost::shared_ptr<NamespaceNode>& root, const std::vector<std::string>& args,
+                       std::ostream& out, std::ostream& err, const RunOptions& options = RunOptions());
 
 }  // namespace AutoCli

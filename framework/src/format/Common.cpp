@@ -1,6 +1,8 @@
 #include "Common.h"
 
 #include <algorithm>
+#include <charconv>
+#include <cstdint>
 
 namespace AutoCli {
 namespace Formatting {
@@ -14,6 +16,29 @@ bool Contains(const std::vector<std::string>& names, const std::string& name) {
 void AddUnique(std::vector<std::string>& names, const std::string& name) {
     if (!Contains(names, name)) names.push_back(name);
 }
+
+// Which fields of a record are taken: bits of one word for any usual
+// record, so that choosing the fields of each of a thousand records
+// allocates nothing.
+class FieldSet {
+public:
+    explicit FieldSet(std::size_t count) {
+        if (count > kWordBits) many_.assign(count, false);
+    }
+    bool Has(std::size_t i) const { return many_.empty() ? ((word_ >> i) & 1u) != 0 : many_[i]; }
+    void Add(std::size_t i) {
+        if (many_.empty()) {
+            word_ |= std::uint64_t{1} << i;
+        } else {
+            many_[i] = true;
+        }
+    }
+
+private:
+    static constexpr std::size_t kWordBits = 64;
+    std::uint64_t word_ = 0;
+    std::vector<bool> many_;
+};
 
 void AppendRecordInline(std::string& out, const MetaStruct& record, const FormatHints& hints,
                         const InlineStyle& style) {
@@ -43,8 +68,16 @@ std::vector<std::string> ChooseColumns(const std::vector<const MetaStruct*>& rec
     }
     std::vector<std::string> recordNames;
     for (const MetaStruct* record : records) {
+        // The records of a list mostly have the same fields in the same
+        // order: a name found where the last record had it is known already.
+        std::size_t known = 0;
         for (const auto& field : record->GetFields()) {
-            if (IsPresent(field.second)) AddUnique(recordNames, field.first);
+            if (!IsPresent(field.second)) continue;
+            if (known < recordNames.size() && recordNames[known] == field.first) {
+                ++known;
+                continue;
+            }
+            AddUnique(recordNames, field.first);
         }
     }
     std::vector<std::string> templateNames;
@@ -90,9 +123,17 @@ void AppendScalarText(std::string& out, const MetaObject& value) {
         case MetaObj::META_STRING:
             out += static_cast<const MetaObj::MetaString&>(value).GetValue();
             break;
-        case MetaObj::META_INT:
-            out += static_cast<const MetaObj::MetaInt&>(value).ToString();
+        case MetaObj::META_INT: {
+            // Written in place, the same digits as MetaInt::ToString: a
+            // listing prints thousands of numbers.
+            const auto& number = static_cast<const MetaObj::MetaInt&>(value);
+            char digits[24];
+            const std::to_chars_result written =
+                number.IsUnsigned() ? std::to_chars(digits, digits + sizeof digits, number.GetUnsignedValue())
+                                    : std::to_chars(digits, digits + sizeof digits, number.GetValue());
+            out.append(digits, static_cast<std::size_t>(written.ptr - digits));
             break;
+        }
         case MetaObj::META_BOOL:
             out += static_cast<const MetaObj::MetaBool&>(value).GetValue() ? "true" : "false";
             break;
@@ -118,43 +159,49 @@ std::vector<const MetaObject*> PresentElements(const MetaList& list) {
 
 std::vector<const MetaStruct::Field*> SelectFields(const MetaStruct& record, const FormatHints& hints,
                                                    FieldSelection selection) {
-    const std::vector<MetaStruct::Field>& fields = record.GetFields();
     std::vector<const MetaStruct::Field*> chosen;
+    SelectFields(record, hints, selection, chosen);
+    return chosen;
+}
+
+void SelectFields(const MetaStruct& record, const FormatHints& hints, FieldSelection selection,
+                  std::vector<const MetaStruct::Field*>& chosen) {
+    const std::vector<MetaStruct::Field>& fields = record.GetFields();
+    chosen.clear();
     chosen.reserve(fields.size());
-    auto choosePresent = [&](const std::vector<bool>* taken) {
+    FieldSet taken(fields.size());
+    auto choosePresent = [&](bool skipTaken) {
         for (std::size_t i = 0; i < fields.size(); ++i) {
-            if ((!taken || !(*taken)[i]) && IsPresent(fields[i].second)) chosen.push_back(&fields[i]);
+            if ((!skipTaken || !taken.Has(i)) && IsPresent(fields[i].second)) chosen.push_back(&fields[i]);
         }
     };
     const std::optional<std::vector<std::string>>& hinted = hints.Fields(record.GetTypeName());
     if (!hinted) {
-        choosePresent(nullptr);
-        return chosen;
+        choosePresent(false);
+        return;
     }
 
     // A record's field names are unique, so each hinted name takes at most
     // one field. Commands set fields in the hint's order, so the search
     // starts after the field the previous name took.
-    std::vector<bool> taken(fields.size(), false);
     std::size_t next = 0;
     for (const auto& name : *hinted) {
         for (std::size_t step = 0; step < fields.size(); ++step) {
             const std::size_t i = (next + step) % fields.size();
             if (fields[i].first != name) continue;
-            if (!taken[i] && IsPresent(fields[i].second)) {
+            if (!taken.Has(i) && IsPresent(fields[i].second)) {
                 chosen.push_back(&fields[i]);
-                taken[i] = true;
+                taken.Add(i);
                 next = i + 1;
             }
             break;
         }
     }
     if (chosen.empty()) {
-        choosePresent(nullptr);
+        choosePresent(false);
     } else if (selection == FieldSelection::HintedFirst) {
-        choosePresent(&taken);
+        choosePresent(true);
     }
-    return chosen;
 }
 
 void AppendInlineText(std::string& out, const MetaObject& value, const std::string& type, const std::string& field,

@@ -52,6 +52,10 @@ std::vector<const MetaObject*> PresentElements(const MetaList& list);
 enum class FieldSelection { HintedOnly, HintedFirst };
 std::vector<const MetaStruct::Field*> SelectFields(const MetaStruct& record, const FormatHints& hints,
                                                    FieldSelection selection);
+// The same, into `chosen` (cleared first), whose room is reused from record
+// to record.
+void SelectFields(const MetaStruct& record, const FormatHints& hints, FieldSelection selection,
+                  std::vector<const MetaStruct::Field*>& chosen);
 
 // How a value reads inside one line or one table cell.
 struct InlineStyle {

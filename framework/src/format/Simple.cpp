@@ -1,5 +1,7 @@
 // The default human format: an optional heading per record, then one
 // "Name: value" line per field, nested records indented further.
+#include <deque>
+
 #include "Common.h"
 
 namespace AutoCli {
@@ -51,7 +53,8 @@ private:
 
     void RecordList(const MetaList& list, std::size_t headerIndent, std::size_t fieldIndent) {
         const char* separator = "";
-        for (const MetaObject* element : PresentElements(list)) {
+        for (const MetaObjectPtr& element : list.GetElements()) {
+            if (!IsPresent(element)) continue;
             text_ += separator;
             Record(*AsRecord(element), headerIndent, fieldIndent);
             separator = "\n";
@@ -61,15 +64,30 @@ private:
 
     void Record(const MetaStruct& record, std::size_t headerIndent, std::size_t fieldIndent) {
         const std::string& type = record.GetTypeName();
-        const std::optional<std::string>& header = hints_.Header(type);
-        if (header && !hints_.HasNoHeader(type)) {
+        if (const std::string* header = Header(type)) {
             text_.append(headerIndent, ' ');
             Substitute(*header, record);
             text_ += '\n';
         }
-        for (const MetaStruct::Field* field : SelectFields(record, hints_, FieldSelection::HintedOnly)) {
-            Field(type, *field, fieldIndent);
+        // Each depth of nesting has its own list of chosen fields, kept from
+        // record to record.
+        if (depth_ == selections_.size()) selections_.emplace_back();
+        std::vector<const MetaStruct::Field*>& chosen = selections_[depth_];
+        SelectFields(record, hints_, FieldSelection::HintedOnly, chosen);
+        ++depth_;
+        for (const MetaStruct::Field* field : chosen) Field(type, *field, fieldIndent);
+        --depth_;
+    }
+
+    // The heading template of a record type, or null when it has none. The
+    // records of a list are of one type, so the last answer is kept.
+    const std::string* Header(const std::string& type) {
+        if (!headerType_ || *headerType_ != type) {
+            const std::optional<std::string>& header = hints_.Header(type);
+            header_ = header && !hints_.HasNoHeader(type) ? &*header : nullptr;
+            headerType_ = &type;
         }
+        return header_;
     }
 
     void Field(const std::string& type, const MetaStruct::Field& field, std::size_t indent) {
@@ -127,6 +145,10 @@ private:
     const InlineStyle style_;
     std::ostream& out_;
     std::string text_;
+    std::deque<std::vector<const MetaStruct::Field*>> selections_;
+    std::size_t depth_ = 0;
+    const std::string* headerType_ = nullptr;
+    const std::string* header_ = nullptr;
 };
 
 }  // namespace

@@ -3,6 +3,7 @@
 #include "Common.h"
 
 #include <algorithm>
+#include <cstring>
 
 namespace AutoCli {
 namespace Formatting {
@@ -14,11 +15,24 @@ const char kColumnGap[] = "  ";
 const std::size_t kFlushSize = 32 * 1024;
 
 void AppendRow(std::string& text, const std::vector<std::string>& cells, const std::vector<std::size_t>& widths) {
-    const std::size_t start = text.size();
+    // The row is laid out in room made for it at once: blanks everywhere,
+    // then each cell's text at its column. A padded cell takes the bytes of
+    // its text plus the blanks its width lacks.
+    const std::size_t gap = sizeof kColumnGap - 1;
+    std::size_t length = 0;
     for (std::size_t i = 0; i < cells.size(); ++i) {
-        if (i > 0) text += kColumnGap;
-        text += cells[i];
-        if (i + 1 < cells.size()) text.append(widths[i] - DisplayWidth(cells[i]), ' ');
+        if (i > 0) length += gap;
+        length += cells[i].size();
+        if (i + 1 < cells.size()) length += widths[i] - DisplayWidth(cells[i]);
+    }
+    const std::size_t start = text.size();
+    text.resize(start + length, ' ');
+    std::size_t pos = start;
+    for (std::size_t i = 0; i < cells.size(); ++i) {
+        if (i > 0) pos += gap;
+        std::memcpy(&text[pos], cells[i].data(), cells[i].size());
+        pos += cells[i].size();
+        if (i + 1 < cells.size()) pos += widths[i] - DisplayWidth(cells[i]);
     }
     // Empty cells at the end of a row would otherwise leave the padding and
     // gaps before them hanging.

@@ -5,13 +5,14 @@
 #include <exception>
 #include <string>
 #include <vector>
+#include "hostctl/Export.h"
 
 namespace HostCtl {
 namespace Lib {
 
 // A machine-readable companion of a message: an identifier and its
 // arguments, for callers that log or translate messages.
-class VobMessage {
+class HOSTCTL_EXPORT VobMessage {
 public:
     VobMessage() = default;
     explicit VobMessage(const std::string& id, const std::vector<std::string>& arguments = {})
@@ -25,7 +26,7 @@ private:
     std::vector<std::string> arguments_;
 };
 
-class HostCtlException : public std::exception {
+class HOSTCTL_EXPORT HostCtlException : public std::exception {
 public:
     explicit HostCtlException(const std::string& message, const VobMessage& vob = VobMessage());
     ~HostCtlException() override;
@@ -47,7 +48,7 @@ namespace PldCtl {
 namespace Lib {
 
 // A library error that also records where in the library it was raised.
-class PldCtlException : public HostCtl::Lib::HostCtlException {
+class HOSTCTL_EXPORT PldCtlException : public HostCtl::Lib::HostCtlException {
 public:
     PldCtlException(const std::string& message, const std::string& sourcePath, int line,
                     const HostCtl::Lib::VobMessage& vob = HostCtl::Lib::VobMessage());

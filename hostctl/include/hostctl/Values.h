@@ -12,13 +12,14 @@
 #include <cstdint>
 #include <memory>
 #include <string>
+#include "hostctl/Export.h"
 
 namespace HostCtl {
 namespace Network {
 
 // What an IPv4 and an IPv6 address have in common, so that one list (the
 // name servers of a resolver, for instance) can hold either.
-class IpAddress {
+class HOSTCTL_EXPORT IpAddress {
 public:
     enum class Family { Ipv4, Ipv6 };
 
@@ -43,7 +44,7 @@ protected:
     IpAddress& operator=(const IpAddress&) = default;
 };
 
-class Ipv4Address : public IpAddress {
+class HOSTCTL_EXPORT Ipv4Address : public IpAddress {
 public:
     // 0.0.0.0: the library's "no address".
     Ipv4Address() = default;
@@ -71,7 +72,7 @@ private:
     uint32_t value_ = 0;
 };
 
-class Ipv6Address : public IpAddress {
+class HOSTCTL_EXPORT Ipv6Address : public IpAddress {
 public:
     using Bytes = std::array<uint8_t, 16>;
 
@@ -107,7 +108,7 @@ private:
 
 // An IPv4 address with a prefix length: a route's destination, a firewall
 // range, an interface's address with its netmask.
-class Ipv4Network {
+class HOSTCTL_EXPORT Ipv4Network {
 public:
     // 0.0.0.0/0, the whole address space.
     Ipv4Network() = default;
@@ -149,7 +150,7 @@ private:
 // carries the type and state the IP stack reports for it; they describe the
 // address's life on the interface, not which address it is, so comparisons
 // ignore them.
-class Ipv6Network {
+class HOSTCTL_EXPORT Ipv6Network {
 public:
     // Values of GetIpv6AddressType.
     static constexpr int TYPE_STATIC = 0;
@@ -201,7 +202,7 @@ private:
     int status_ = STATUS_PREFERRED;
 };
 
-class MacAddress {
+class HOSTCTL_EXPORT MacAddress {
 public:
     using Bytes = std::array<uint8_t, 6>;
 

@@ -1,5 +1,7 @@
 #include "vswitch/VirtualSwitchPortGroupList.h"
 
+#include <utility>
+
 #include "common/CommandSupport.h"
 #include "hostctl/network/NetworkInfoImpl.h"
 #include "hostctl/network/vswitch/SwitchImpl.h"
@@ -34,7 +36,9 @@ void VirtualSwitchPortGroupList::ExecuteInternal(boost::shared_ptr<CallSpec::Inp
     ReportingHostErrors(output, [&] {
         boost::shared_ptr<MetaObj::MetaList> portGroups =
             MetaObj::MetaList::New(MetaObj::META_STRUCT, GetOutputStructure());
-        for (const auto& portGroup : networkInfo.GetAllPortGroups()) {
+        const auto all = networkInfo.GetAllPortGroups();
+        portGroups->Reserve(all.size());
+        for (const auto& portGroup : all) {
             // Active clients are only known to the implementation; a port
             // group of another kind is looked up again by name.
             const auto* impl = dynamic_cast<const PldCtl::Network::PortGroupImpl*>(portGroup.get());
@@ -45,7 +49,7 @@ void VirtualSwitchPortGroupList::ExecuteInternal(boost::shared_ptr<CallSpec::Inp
             record->SetField("Virtual Switch", portGroup->GetVirtualSwitchName());
             record->SetField("Active Clients", activeClients);
             record->SetField("VLAN ID", portGroup->GetVlanId());
-            portGroups->Append(record);
+            portGroups->Append(std::move(record));
         }
         Finish(output, portGroups);
     });

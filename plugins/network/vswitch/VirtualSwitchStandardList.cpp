@@ -4,6 +4,7 @@
 #include <memory>
 #include <set>
 #include <string>
+#include <utility>
 #include <vector>
 
 #include "common/CommandSupport.h"
@@ -43,10 +44,12 @@ void FillSwitchRecord(MetaObj::MetaStruct& record, const HostCtl::Network::Virtu
     uplinks.erase(std::remove_if(uplinks.begin(), uplinks.end(),
                                  [&](const std::string& uplink) { return pnics.count(uplink) == 0; }),
                   uplinks.end());
-    record.SetField("Uplinks", uplinks);
+    record.SetField("Uplinks", std::move(uplinks));
+    const auto portGroups = vswitch.GetPortGroups();
     std::vector<std::string> portGroupNames;
-    for (const auto& portGroup : vswitch.GetPortGroups()) portGroupNames.push_back(portGroup->GetName());
-    record.SetField("Portgroups", portGroupNames);
+    portGroupNames.reserve(portGroups.size());
+    for (const auto& portGroup : portGroups) portGroupNames.push_back(portGroup->GetName());
+    record.SetField("Portgroups", std::move(portGroupNames));
 }
 
 }  // namespace
@@ -96,6 +99,7 @@ void VirtualSwitchStandardList::ExecuteInternal(boost::shared_ptr<CallSpec::Inpu
 
         boost::shared_ptr<MetaObj::MetaList> records =
             MetaObj::MetaList::New(MetaObj::META_STRUCT, GetOutputStructure());
+        records->Reserve(switches.size());
         bool complete = true;
         for (const auto& vswitch : switches) {
             if (!dynamic_cast<const PldCtl::Network::VirtualSwitchImpl*>(vswitch.get())) {
@@ -104,7 +108,7 @@ void VirtualSwitchStandardList::ExecuteInternal(boost::shared_ptr<CallSpec::Inpu
             }
             boost::shared_ptr<MetaObj::MetaStruct> record = GetOutputStructure();
             FillSwitchRecord(*record, *vswitch, pnics);
-            records->Append(record);
+            records->Append(std::move(record));
         }
         // The switches read so far are still shown beside the error.
         if (!complete) output->SetError("Unable to access all portsets");

@@ -5,13 +5,14 @@
 #include <memory>
 #include <string>
 
+#include "hostctl/Export.h"
 #include "hostctl/network/vswitch/VirtualSwitch.h"
 
 namespace HostCtl {
 namespace Network {
 
 // Lookups of the host's networking objects.
-class NetworkFactory {
+class HOSTCTL_EXPORT NetworkFactory {
 public:
     // The standard switch of that name, or null.
     static std::unique_ptr<VirtualSwitch> GetVirtualSwitchById(const std::string& name);

@@ -4,13 +4,14 @@
 #include <memory>
 #include <vector>
 
+#include "hostctl/Export.h"
 #include "hostctl/network/nic/Pnic.h"
 #include "hostctl/network/vswitch/VirtualSwitch.h"
 
 namespace PldCtl {
 namespace Network {
 
-class NetworkInfoImpl {
+class HOSTCTL_EXPORT NetworkInfoImpl {
 public:
     // Never throws: the host is reached by the operations.
     NetworkInfoImpl();

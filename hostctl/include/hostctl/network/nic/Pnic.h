@@ -3,12 +3,13 @@
 #pragma once
 
 #include <string>
+#include "hostctl/Export.h"
 
 namespace HostCtl {
 namespace Network {
 
 // A physical NIC.
-class Pnic {
+class HOSTCTL_EXPORT Pnic {
 public:
     virtual ~Pnic();
     virtual std::string GetName() const = 0;

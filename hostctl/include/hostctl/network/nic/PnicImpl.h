@@ -3,13 +3,14 @@
 
 #include <string>
 
+#include "hostctl/Export.h"
 #include "hostctl/network/nic/Pnic.h"
 
 namespace PldCtl {
 namespace Network {
 
 // A physical NIC, found by name.
-class PnicImpl : public virtual HostCtl::Network::Pnic {
+class HOSTCTL_EXPORT PnicImpl : public virtual HostCtl::Network::Pnic {
 public:
     explicit PnicImpl(const std::string& name);
     ~PnicImpl() override;

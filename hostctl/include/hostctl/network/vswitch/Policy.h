@@ -12,6 +12,7 @@
 #include <optional>
 #include <string>
 #include <vector>
+#include "hostctl/Export.h"
 
 namespace HostCtl {
 namespace Network {
@@ -25,7 +26,7 @@ enum TeamPolicyType {
 };
 
 // How a failed uplink is detected.
-class LinkCriteriaSelectionPolicy {
+class HOSTCTL_EXPORT LinkCriteriaSelectionPolicy {
 public:
     LinkCriteriaSelectionPolicy() = default;
 
@@ -40,7 +41,7 @@ private:
     bool beaconChecking_ = false;
 };
 
-class NicTeamingPolicy {
+class HOSTCTL_EXPORT NicTeamingPolicy {
 public:
     // Port ID load balancing, link state detection, notify switches, no
     // rolling restoration, an empty uplink order, one active uplink.
@@ -84,7 +85,7 @@ private:
     std::optional<int> maxActive_;
 };
 
-class PortSecurityPolicy {
+class HOSTCTL_EXPORT PortSecurityPolicy {
 public:
     // No promiscuous mode; MAC changes and forged transmits allowed.
     static PortSecurityPolicy GetDefaultPolicy();
@@ -110,7 +111,7 @@ private:
 };
 
 // Bandwidths in bits per second, burst size in bytes.
-class ShapingPolicy {
+class HOSTCTL_EXPORT ShapingPolicy {
 public:
     // Disabled; 100 Mbit/s average and peak; 100 MiB burst.
     static ShapingPolicy GetDefaultPolicy();
@@ -140,7 +141,7 @@ private:
 };
 
 // The offloads a switch offers its ports.
-class NicCapabilities {
+class HOSTCTL_EXPORT NicCapabilities {
 public:
     // Checksum offload, segmentation offload and VLAN tagging all on.
     static NicCapabilities GetDefaultPolicy();

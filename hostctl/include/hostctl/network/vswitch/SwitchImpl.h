@@ -7,6 +7,7 @@
 #include <string>
 #include <vector>
 
+#include "hostctl/Export.h"
 #include "hostctl/network/vswitch/VirtualSwitch.h"
 
 namespace PldCtl {
@@ -19,7 +20,7 @@ struct PortGroupRecord;
 namespace Network {
 
 // A port set as the host stores it; the base of every kind of switch.
-class PortsetImpl : public virtual HostCtl::Network::Portset {
+class HOSTCTL_EXPORT PortsetImpl : public virtual HostCtl::Network::Portset {
 public:
     ~PortsetImpl() override;
 
@@ -46,7 +47,7 @@ private:
     const std::pair<int, int>& PortCounts() const;
 };
 
-class VirtualSwitchImpl : public PortsetImpl, public virtual HostCtl::Network::VirtualSwitch {
+class HOSTCTL_EXPORT VirtualSwitchImpl : public PortsetImpl, public virtual HostCtl::Network::VirtualSwitch {
 public:
     // A snapshot of a stored switch.
     explicit VirtualSwitchImpl(std::shared_ptr<const Detail::VswitchRecord> record);
@@ -86,7 +87,7 @@ private:
 
 // A port group, found by name. Made from a name it never throws; its
 // operations throw when the host has no port group of that name.
-class PortGroupImpl : public virtual HostCtl::Network::PortGroup {
+class HOSTCTL_EXPORT PortGroupImpl : public virtual HostCtl::Network::PortGroup {
 public:
     explicit PortGroupImpl(const std::string& name);
     // A snapshot of a stored port group; a listing that counted the active
@@ -124,7 +125,7 @@ private:
 };
 
 // The host's standard switches.
-class VirtualSwitchInfoImpl {
+class HOSTCTL_EXPORT VirtualSwitchInfoImpl {
 public:
     VirtualSwitchInfoImpl();
     virtual ~VirtualSwitchInfoImpl();

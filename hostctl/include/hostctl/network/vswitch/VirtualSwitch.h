@@ -14,6 +14,7 @@
 #include <string>
 #include <vector>
 
+#include "hostctl/Export.h"
 #include "hostctl/network/vswitch/Policy.h"
 
 namespace HostCtl {
@@ -22,7 +23,7 @@ namespace Network {
 class PortGroup;
 
 // A set of ports: a standard or a distributed switch.
-class Portset {
+class HOSTCTL_EXPORT Portset {
 public:
     // The ports a new switch gets when none are asked for.
     static constexpr int DEF_NUM_PORTS = 128;
@@ -44,7 +45,7 @@ public:
 };
 
 // A standard virtual switch.
-class VirtualSwitch : public virtual Portset {
+class HOSTCTL_EXPORT VirtualSwitch : public virtual Portset {
 public:
     ~VirtualSwitch() override;
 
@@ -89,7 +90,7 @@ public:
 };
 
 // A port group of a standard switch.
-class PortGroup {
+class HOSTCTL_EXPORT PortGroup {
 public:
     static constexpr std::uint16_t MIN_VLAN_ID = 0;
     static constexpr std::uint16_t MAX_VLAN_ID = 4095;
