@@ -211,9 +211,9 @@ TEST_F(TreeSweep, EveryOutputTemplateRendersInEveryFormatter) {
     for (const auto& leaf : Leaves()) {
         const std::string path = leaf.Path();
         AutoCli::Command& command = *leaf.node->AsCommand();
-        boost::shared_ptr<CallSpec::OutputSpec> spec = command.GetOutputSpec();
-        ASSERT_TRUE(spec && spec->GetTemplate()) << path;
-        const MetaObjectPtr& templ = spec->GetTemplate();
+        boost::shared_ptr<CallSpec::OutputSpec> outputSpec = command.GetOutputSpec();
+        ASSERT_TRUE(outputSpec && outputSpec->GetTemplate()) << path;
+        const MetaObjectPtr& templ = outputSpec->GetTemplate();
 
         // A fetcher answers with a record or a list; a changing command
         // ("operation", "operator" or no type at all) with true or false.
