@@ -29,10 +29,10 @@ using Arguments = std::vector<std::pair<std::string, std::string>>;
 // (so a misspelt option name fails the test), but without the constraints:
 // values the framework refuses can still reach the command.
 boost::shared_ptr<CallSpec::Output> RunCommand(AutoCli::Command& command, const Arguments& arguments) {
-    boost::shared_ptr<CallSpec::InputSpec> spec = command.GetInputSpec();
+    boost::shared_ptr<CallSpec::InputSpec> inputSpec = command.GetInputSpec();
     boost::shared_ptr<CallSpec::Input> input = CallSpec::Input::New();
     for (const auto& [name, text] : arguments) {
-        boost::shared_ptr<CallSpec::ParameterSpec> parameter = spec->FindByName(name);
+        boost::shared_ptr<CallSpec::ParameterSpec> parameter = inputSpec->FindByName(name);
         if (!parameter) throw std::invalid_argument("no parameter " + name);
         if (parameter->GetType() == CallSpec::PARAM_INT) {
             input->SetInt(name, text, std::stoll(text));
