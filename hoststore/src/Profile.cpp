@@ -20,6 +20,45 @@ namespace {
 // enough that a wrong file name cannot exhaust memory.
 constexpr off_t kMaxProfileBytes = off_t(256) << 20;
 
+// A host is a few levels deep (section, object, policy, list); the bound
+// leaves room for hand-written extras while keeping every later walk over a
+// document (copying, writing, comparing, all recursive) to a small stack.
+constexpr int kMaxProfileDepth = 64;
+
+// Refuses a text whose arrays and objects nest deeper than kMaxProfileDepth,
+// before a document is built from it. The scan does not recurse, so a
+// hostile file cannot exhaust the stack here either; it skips strings, and
+// leaves every other error to the parser.
+void CheckDepth(const std::string& text, const std::string& label) {
+    int depth = 0;
+    bool inString = false;
+    std::size_t line = 1;
+    std::size_t lineStart = 0;
+    for (std::size_t i = 0; i < text.size(); ++i) {
+        const char c = text[i];
+        if (inString) {
+            if (c == '\\') {
+                ++i;
+            } else if (c == '"') {
+                inString = false;
+            }
+        } else if (c == '"') {
+            inString = true;
+        } else if (c == '\n') {
+            ++line;
+            lineStart = i + 1;
+        } else if (c == '[' || c == '{') {
+            if (++depth > kMaxProfileDepth) {
+                throw ProfileError(label + ": nested deeper than " + std::to_string(kMaxProfileDepth) +
+                                   " levels at line " + std::to_string(line) + ", column " +
+                                   std::to_string(i - lineStart + 1));
+            }
+        } else if (c == ']' || c == '}') {
+            --depth;
+        }
+    }
+}
+
 const CollectionInfo* FindCollection(const std::string& section) {
     for (const auto& c : Collections()) {
         if (section == c.section) return &c;
@@ -134,6 +173,7 @@ void ValidateProfile(const Json& profile) {
 
 Json ParseProfile(const std::string& text, const std::string& origin) {
     const std::string label = "profile " + origin;
+    CheckDepth(text, label);
     Json profile;
     try {
         profile = Json::parse(text);

@@ -43,6 +43,23 @@ TEST(ProfileTest, HeaderShapeAndJsonErrors) {
     EXPECT_EQ(message.find("[json.exception"), std::string::npos) << message;
 }
 
+// A value of `levels` nested arrays, as the "x" member of the system section.
+std::string Nested(std::size_t levels, const std::string& inner = "") {
+    return WithSections(R"("system": {"x": )" + std::string(levels, '[') + inner + std::string(levels, ']') + "}");
+}
+
+TEST(ProfileTest, NestingIsBounded) {
+    // The top-level object and the system section are two of the 64 levels.
+    EXPECT_EQ(ErrorOf(Nested(62)), "(accepted)");
+    EXPECT_EQ(ErrorOf(Nested(63)), "profile t.json: nested deeper than 64 levels at line 1, column 126");
+    // Far too deep for any recursive walk over the document: refused, not a crash.
+    EXPECT_EQ(ErrorOf(Nested(100000)), "profile t.json: nested deeper than 64 levels at line 1, column 126");
+    // Brackets in strings, escaped quotes included, are text, not nesting.
+    EXPECT_EQ(ErrorOf(Nested(1, R"("\"[[[[" , ")" + std::string(100, '{') + "\"")), "(accepted)");
+    // Lines are counted for the position.
+    EXPECT_EQ(ErrorOf("\n\n" + Nested(70)), "profile t.json: nested deeper than 64 levels at line 3, column 126");
+}
+
 TEST(ProfileTest, KeyAndParentErrors) {
     EXPECT_EQ(ErrorOf(WithSections(R"("nics": [{"name": true}])")),
               "profile t.json: nics[0]: field 'name' must be a string or an integer, not boolean");
