@@ -75,6 +75,39 @@ TEST_F(Switches, TheLibraryChecksWhatTheCommandsCheckFirst) {
     EXPECT_EQ(vSwitch1->GetMTU(), 9000);
 }
 
+TEST_F(Switches, PortGroupNamesArePrintableUtf8) {
+    auto vswitch = Switch("vSwitch1");
+    const std::size_t before = Dump()["portgroups"].size();
+    const std::vector<std::string> refused = {
+        "pg\xc3",            // cut short
+        "pg\xc3(",           // a lead byte without its continuation
+        "\xc0\xaf",          // overlong '/'
+        "\xe0\x80\xaf",      // overlong '/', three bytes
+        "\xed\xa0\x80",      // a surrogate
+        "\xf4\x90\x80\x80",  // beyond U+10FFFF
+        "\xff",
+        "tab\there",
+        "del\x7f",
+        "esc\x1b[31m",
+        "pg\xc2\x9b",  // U+009B, the one-byte escape introducer
+        std::string(65, 'a'),
+    };
+    for (const std::string& name : refused) {
+        EXPECT_EQ(MessageOf([&] { vswitch->AddPortGroup(name); }),
+                  "Invalid port group name '" + name +
+                      "': use 1 to 64 printable characters, not beginning or ending with a blank");
+    }
+    EXPECT_EQ(Dump()["portgroups"].size(), before);
+
+    // The limit counts characters: 64 two-byte letters fit.
+    std::string letters;
+    for (int i = 0; i < 64; ++i) letters += "\xc3\xa9";
+    for (const std::string& name : {letters, std::string("\xe6\x97\xa5 \xf0\x9f\x96\xa7 \xc2\xa0")}) {
+        EXPECT_EQ(vswitch->AddPortGroup(name)->GetName(), name);
+    }
+    EXPECT_EQ(Dump()["portgroups"].size(), before + 2);
+}
+
 TEST_F(Switches, PolicyEditsFromOlderSnapshotsKeepEachOther) {
     // Two commands read the same policies, each changes one field and writes
     // back what it read: neither may undo the other.

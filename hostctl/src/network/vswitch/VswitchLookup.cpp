@@ -1,8 +1,8 @@
 #include "network/vswitch/VswitchLookup.h"
 
 #include <algorithm>
-#include <cctype>
 
+#include "Text.h"
 #include "hostctl/Lib.h"
 #include "hostctl/network/vswitch/VswitchTables.h"
 #include "network/nic/NicRecords.h"
@@ -40,20 +40,25 @@ template StoredObject<PortGroupRecord> Require<PortGroupRecord>(Store::Transacti
 // Switch names are short words; they name tables' rows and appear in other
 // objects, so no blanks or separators.
 void CheckSwitchName(const std::string& name) {
-    const bool fits = !name.empty() && name.size() <= kMaxSwitchNameLength &&
-                      std::all_of(name.begin(), name.end(),
-                                  [](unsigned char c) { return std::isalnum(c) || c == '-' || c == '_' || c == '.'; });
+    // ASCII only, whatever the locale.
+    auto allowed = [](char c) {
+        return (c >= 'a' && c <= 'z') || (c >= 'A' && c <= 'Z') || (c >= '0' && c <= '9') || c == '-' || c == '_' ||
+               c == '.';
+    };
+    const bool fits =
+        !name.empty() && name.size() <= kMaxSwitchNameLength && std::all_of(name.begin(), name.end(), allowed);
     if (!fits) {
         throw HostCtlException("Invalid virtual switch name '" + name + "': use 1 to " +
                                std::to_string(kMaxSwitchNameLength) + " letters, digits, '.', '-' or '_'");
     }
 }
 
-// Port group names may hold blanks ("VM Network") but no control characters.
+// Port group names may hold blanks ("VM Network") and any printable
+// character, counted as characters, not bytes.
 void CheckPortGroupName(const std::string& name) {
-    const bool fits = !name.empty() && name.size() <= kMaxPortGroupNameLength && name.front() != ' ' &&
-                      name.back() != ' ' &&
-                      std::none_of(name.begin(), name.end(), [](unsigned char c) { return c < 0x20 || c == 0x7f; });
+    const std::optional<std::size_t> length = PrintableLength(name);
+    const bool fits =
+        length && *length >= 1 && *length <= kMaxPortGroupNameLength && name.front() != ' ' && name.back() != ' ';
     if (!fits) {
         throw HostCtlException("Invalid port group name '" + name + "': use 1 to " +
                                std::to_string(kMaxPortGroupNameLength) +
