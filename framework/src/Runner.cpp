@@ -4,12 +4,15 @@
 // status. This is the only place that decides exit statuses.
 #include <sstream>
 
+#include "format/Common.h"
 #include "framework/Format.h"
 #include "framework/Runner.h"
 
 namespace AutoCli {
 
 namespace {
+
+using Formatting::EscapeControls;
 
 struct CommandLine {
     std::vector<std::string> pathWords;
@@ -103,7 +106,7 @@ int Execute(Command& command, const CommandLine& line, std::ostream& out, std::o
     try {
         input = ParseArguments(*line.parameters, line.commandArgs);
     } catch (const UsageError& e) {
-        err << options.program << ": " << e.what() << "\n"
+        err << options.program << ": " << EscapeControls(e.what()) << "\n"
             << "Run '" << options.program << " " << path << " --help' for its options.\n";
         return kExitUsage;
     }
@@ -146,7 +149,7 @@ int Execute(Command& command, const CommandLine& line, std::ostream& out, std::o
         // would otherwise mark `out` as failed.
         if (rendered.tellp() > 0) out << rendered.rdbuf();
     }
-    for (const auto& message : output->GetErrors()) err << message << "\n";
+    for (const auto& message : output->GetErrors()) err << EscapeControls(message) << "\n";
     return output->HasError() ? kExitCommandError : kExitOk;
 }
 
@@ -159,7 +162,7 @@ int Run(const boost::shared_ptr<NamespaceNode>& root, const std::vector<std::str
         try {
             line = Resolve(root, args);
         } catch (const UsageError& e) {
-            err << options.program << ": " << e.what() << "\n";
+            err << options.program << ": " << EscapeControls(e.what()) << "\n";
             return kExitUsage;
         }
         const std::string path = JoinPath(line.pathWords);
@@ -185,7 +188,7 @@ int Run(const boost::shared_ptr<NamespaceNode>& root, const std::vector<std::str
         }
         return Execute(*command, line, out, err, options);
     } catch (const std::exception& e) {
-        err << options.program << ": " << e.what() << "\n";
+        err << options.program << ": " << EscapeControls(e.what()) << "\n";
         return kExitFailure;
     } catch (...) {
         err << options.program << ": internal error: unknown exception\n";

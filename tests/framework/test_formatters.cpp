@@ -397,6 +397,33 @@ TEST(KeyValueFormatter, KeysSpellThePath) {
     EXPECT_EQ(Render("keyvalue", SwitchList({})), "");
 }
 
+// A name with an escape sequence, a bell, a tab, a C1 control character
+// (U+009B), a stray byte before a real letter, and a backslash.
+TEST(Formatters, HumanFormatsEscapeControlCharactersMachineFormatsKeepThem) {
+    const std::string name =
+        "red\x1b[31m\x07\tc\xc2\x9b"
+        "2J\xc3\xc3\xa9\\";
+    const std::string shown = "red\\x1b[31m\\x07\\x09c\\u009b2J\\xc3\xc3\xa9\\";
+    StructPtr s = Switch(name, 8, {"up\x1b", "ok"});
+    EXPECT_EQ(Render("simple", s, {{"header:VirtualSwitch", "Switch %Name%"}}),
+              "Switch " + shown + "\n   Name: " + shown + "\n   Num Ports: 8\n   Uplinks: up\\x1b, ok\n");
+    EXPECT_EQ(Render("simple", Strings({name})), shown + "\n");
+    // Columns are as wide as what is shown.
+    EXPECT_EQ(Render("table", SwitchList({s, Switch("b", 1, {})})),
+              "Name                                Num Ports  Uplinks\n"
+              "----------------------------------  ---------  ----------\n" +
+                  shown + "  8          up\\x1b, ok\n" + "b                                   1\n");
+    // Key-value lines keep their own escapes for line breaks and backslashes.
+    s->SetField("Path", "C:\\dir\n\x1b");
+    EXPECT_EQ(Render("keyvalue", s),
+              "VirtualSwitch.Name=red\\x1b[31m\\x07\\x09c\\u009b2J\\xc3\xc3\xa9\\\\\n"
+              "VirtualSwitch.Num Ports=8\n"
+              "VirtualSwitch.Uplinks[0]=up\\x1b\n"
+              "VirtualSwitch.Uplinks[1]=ok\n"
+              "VirtualSwitch.Path=C:\\\\dir\\n\\x1b\n");
+    EXPECT_EQ(Render("csv", Switch(name, 8, {})), "Name,Num Ports,Uplinks\n" + name + ",8,\n");
+}
+
 // Values handed over (moved) and values copied end up the same; a field set
 // again keeps its place; the checks hold on either path.
 TEST(MetaValues, MovedAndCopiedValuesAreTheSame) {

@@ -129,6 +129,8 @@ TEST(Runner, RefusesBadCommandLines) {
     const std::vector<std::pair<std::vector<std::string>, std::string>> cases = {
         {{"tpo"}, "tool: Unknown command or namespace 'tpo'. Did you mean 'top'?\n"},
         {{"top", "--bogus"}, "tool: Unknown option --bogus for 'top'\n"},
+        // What the user typed is echoed with its control characters escaped.
+        {{"top", "--bo\x1b]0;x\x07gus"}, "tool: Unknown option --bo\\x1b]0;x\\x07gus for 'top'\n"},
         {{"--formatter=jsno", "top", "list", "-n", "alpha"},
          "tool: Unknown formatter 'jsno'. Did you mean 'json'? Formatters: simple, table, json, xml, csv, keyvalue\n"},
         {{"top", "list", "-n", "alpha", "--formatter"},

@@ -118,10 +118,14 @@ bool IsRecordList(const MetaObjectPtr& value) {
     return list && list->GetElementType() == MetaObj::META_STRUCT;
 }
 
-void AppendScalarText(std::string& out, const MetaObject& value) {
+void AppendScalarText(std::string& out, const MetaObject& value, bool escapeControls) {
     switch (value.GetType()) {
         case MetaObj::META_STRING:
-            out += static_cast<const MetaObj::MetaString&>(value).GetValue();
+            if (escapeControls) {
+                AppendEscapedControls(out, static_cast<const MetaObj::MetaString&>(value).GetValue());
+            } else {
+                out += static_cast<const MetaObj::MetaString&>(value).GetValue();
+            }
             break;
         case MetaObj::META_INT: {
             // Written in place, the same digits as MetaInt::ToString: a
@@ -218,13 +222,13 @@ void AppendInlineText(std::string& out, const MetaObject& value, const std::stri
             if (records) {
                 AppendRecordInline(out, *AsRecord(element), hints, style);
             } else {
-                AppendScalarText(out, *element);
+                AppendScalarText(out, *element, style.escapeControls);
             }
             separator = records ? ", " : style.listSeparator;
         }
         return;
     }
-    AppendScalarText(out, value);
+    AppendScalarText(out, value, style.escapeControls);
     if (style.units) {
         std::string unit = hints.Unit(type, field);
         if (!unit.empty()) {
@@ -238,7 +242,7 @@ InlineStyle ForHints(const InlineStyle& style, const FormatHints& hints) {
     static const std::string kUnitsPrefix = "units:";
     auto first = hints.Raw().lower_bound(kUnitsPrefix);
     const bool anyUnit = first != hints.Raw().end() && first->first.compare(0, kUnitsPrefix.size(), kUnitsPrefix) == 0;
-    return InlineStyle{style.listSeparator, style.units && anyUnit};
+    return InlineStyle{style.listSeparator, style.units && anyUnit, style.escapeControls};
 }
 
 std::string InlineText(const MetaObjectPtr& value, const std::string& type, const std::string& field,
@@ -309,6 +313,42 @@ std::size_t DecodeUtf8(const std::string& text, std::size_t pos, char32_t& codeP
     if (value < smallest || value > 0x10FFFF || (value >= 0xD800 && value <= 0xDFFF)) return 1;
     codePoint = value;
     return length;
+}
+
+void AppendEscapedControls(std::string& out, const std::string& text) {
+    // Most text is printable ASCII and is taken whole.
+    const bool plain = std::all_of(text.begin(), text.end(), [](char c) {
+        const auto byte = static_cast<unsigned char>(c);
+        return byte >= 0x20 && byte < 0x7F;
+    });
+    if (plain) {
+        out += text;
+        return;
+    }
+    static const char kHex[] = "0123456789abcdef";
+    auto escape = [&out](const char* prefix, unsigned value) {
+        out += prefix;
+        out += kHex[(value >> 4) & 0xF];
+        out += kHex[value & 0xF];
+    };
+    for (std::size_t pos = 0; pos < text.size();) {
+        char32_t c;
+        const std::size_t length = DecodeUtf8(text, pos, c);
+        if (IsBadByte(c, length) || c < 0x20 || c == 0x7F) {
+            escape("\\x", static_cast<unsigned char>(text[pos]));
+        } else if (c >= 0x80 && c <= 0x9F) {
+            escape("\\u00", static_cast<unsigned>(c));
+        } else {
+            out.append(text, pos, length);
+        }
+        pos += length;
+    }
+}
+
+std::string EscapeControls(const std::string& text) {
+    std::string escaped;
+    AppendEscapedControls(escaped, text);
+    return escaped;
 }
 
 std::size_t DisplayWidth(const std::string& text) {

@@ -1,7 +1,8 @@
 // What the six formatters share: which values count as present, which fields
 // of a record are shown and in what order, how a value reads inside one line
-// or one cell, the columns of a table, and UTF-8 handling for the machine
-// formats. Private to the framework library.
+// or one cell, the columns of a table, UTF-8 handling for the machine
+// formats and the escaping of control characters for the human ones.
+// Private to the framework library.
 #pragma once
 
 #include <cstddef>
@@ -36,8 +37,9 @@ bool IsRecordList(const MetaObjectPtr& value);
 
 // "abc", "42", "true": the text of a string, int or bool.
 std::string ScalarText(const MetaObject& value);
-// The same, appended to `out`.
-void AppendScalarText(std::string& out, const MetaObject& value);
+// The same, appended to `out`; a string with its control characters
+// escaped when `escapeControls` is set (see AppendEscapedControls).
+void AppendScalarText(std::string& out, const MetaObject& value, bool escapeControls = false);
 
 // The elements of a list that are present, in order. The pointers are valid
 // as long as the list is.
@@ -61,6 +63,7 @@ void SelectFields(const MetaStruct& record, const FormatHints& hints, FieldSelec
 struct InlineStyle {
     const char* listSeparator;  // between the items of a string list
     bool units;                 // a scalar is followed by its unit word, if any
+    bool escapeControls;        // strings are shown with control characters escaped
 };
 
 // The style with units turned off when no hint gives any, so that values
@@ -113,6 +116,15 @@ std::string Recode(const std::string& text, Replace replace) {
     }
     return out;
 }
+
+// Appends `text` as a terminal may show it: each control character (C0,
+// DEL) and each byte that does not begin a well-formed UTF-8 sequence as
+// "\xNN", each C1 control character as "\u00NN", everything else as it
+// is. A control character in a name could otherwise move the cursor,
+// recolour the terminal or set its title. Every human-facing text goes
+// through here; the machine formats keep text exact.
+void AppendEscapedControls(std::string& out, const std::string& text);
+std::string EscapeControls(const std::string& text);
 
 // The number of characters of a text, for lining up columns.
 std::size_t DisplayWidth(const std::string& text);

@@ -7,7 +7,7 @@ namespace Formatting {
 
 namespace {
 
-const InlineStyle kCsvStyle{",", false};
+const InlineStyle kCsvStyle{",", false, false};
 
 std::string Cell(const std::string& text) {
     if (text.find_first_of(",\"\r\n") == std::string::npos) return text;

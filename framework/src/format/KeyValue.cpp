@@ -7,6 +7,8 @@ namespace Formatting {
 
 namespace {
 
+// Line breaks and backslashes are written as in C, so a value stays on its
+// line and reads back; other control characters as everywhere else.
 std::string Escape(const std::string& text) {
     std::string escaped;
     for (char c : text) {
@@ -24,7 +26,7 @@ std::string Escape(const std::string& text) {
                 escaped += c;
         }
     }
-    return escaped;
+    return EscapeControls(escaped);
 }
 
 class KeyValueWriter {

@@ -9,7 +9,7 @@ namespace Formatting {
 
 namespace {
 
-const InlineStyle kSimpleStyle{", ", true};
+const InlineStyle kSimpleStyle{", ", true, true};
 const std::size_t kIndentStep = 3;
 const std::size_t kFlushSize = 32 * 1024;
 
@@ -29,12 +29,12 @@ public:
                 RecordList(*list, 0, kIndentStep);
             } else {
                 for (const MetaObject* element : PresentElements(*list)) {
-                    AppendScalarText(text_, *element);
+                    AppendScalarText(text_, *element, true);
                     text_ += '\n';
                 }
             }
         } else if (!IsSuccess(result)) {
-            AppendScalarText(text_, result);
+            AppendScalarText(text_, result, true);
             text_ += '\n';
         }
         Flush();

@@ -10,7 +10,7 @@ namespace Formatting {
 
 namespace {
 
-const InlineStyle kTableStyle{", ", true};
+const InlineStyle kTableStyle{", ", true, true};
 const char kColumnGap[] = "  ";
 const std::size_t kFlushSize = 32 * 1024;
 

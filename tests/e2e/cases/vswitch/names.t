@@ -1,16 +1,16 @@
 ## Names that are not printable UTF-8 are refused with the command's own
 ## message, exit status 1, and nothing is stored.
 $ orvixcli network vswitch standard portgroup add -v vSwitch0 -p 'pg√'
-! Invalid port group name 'pg√': use 1 to 64 printable characters, not beginning or ending with a blank
+! Invalid port group name 'pg\xc3': use 1 to 64 printable characters, not beginning or ending with a blank
 [1]
 
 ## U+009B, a control character of its own in UTF-8 (bytes c2 9b).
 $ orvixcli network vswitch standard portgroup add -v vSwitch0 -p 'pg¬õ'
-! Invalid port group name 'pg¬õ': use 1 to 64 printable characters, not beginning or ending with a blank
+! Invalid port group name 'pg\u009b': use 1 to 64 printable characters, not beginning or ending with a blank
 [1]
 
 $ orvixcli network vswitch standard add -v 'sw√'
-! Invalid virtual switch name 'sw√': use 1 to 32 letters, digits, '.', '-' or '_'
+! Invalid virtual switch name 'sw\xc3': use 1 to 32 letters, digits, '.', '-' or '_'
 [1]
 
 $ orvixcli network vswitch standard portgroup list --formatter=csv
