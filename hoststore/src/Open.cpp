@@ -3,6 +3,7 @@
 // Creating builds the whole database under a temporary name and links it
 // into place, so the final name never shows a half-built store.
 #include <fcntl.h>
+#include <sys/file.h>
 #include <sys/stat.h>
 #include <unistd.h>
 
@@ -61,6 +62,46 @@ void SyncDirectory(const std::string& directory) {
     close(fd);
 }
 
+// The files SQLite keeps beside a database: its write-ahead log, the log's
+// shared-memory index and its rollback journal.
+constexpr const char* kSideFileSuffixes[] = {"-wal", "-shm", "-journal"};
+
+// Holds an exclusive lock on a directory for one scope, so that processes
+// creating stores in it take turns between looking for the store and linking
+// a new one into place. A directory that cannot be opened for reading is not
+// locked; creating still works, only without that protection.
+class DirectoryLock {
+public:
+    explicit DirectoryLock(const std::string& directory)
+        : fd_(open(directory.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC)) {
+        if (fd_ >= 0) {
+            while (flock(fd_, LOCK_EX) != 0 && errno == EINTR) {
+            }
+        }
+    }
+    ~DirectoryLock() {
+        if (fd_ >= 0) close(fd_);
+    }
+    DirectoryLock(const DirectoryLock&) = delete;
+    DirectoryLock& operator=(const DirectoryLock&) = delete;
+
+private:
+    int fd_;
+};
+
+// Removes the side files a store that no longer exists left at path (a
+// process died with it open, then the file was removed). SQLite would take
+// them for the new file's own and replay the dead store's log into it. A
+// process still holding them keeps only unlinked files that nobody shares.
+void RemoveStaleSideFiles(const std::string& path) {
+    for (const char* suffix : kSideFileSuffixes) {
+        const std::string file = path + suffix;
+        if (unlink(file.c_str()) != 0 && errno != ENOENT) {
+            throw StoreError(SystemError(path, "cannot be created: the stale file '" + file + "' cannot be removed"));
+        }
+    }
+}
+
 // A uniquely named empty file beside the store; it and any SQLite side file
 // are removed when it goes out of scope, after linking as after a failure.
 class TemporaryFile {
@@ -76,7 +117,8 @@ public:
         name_ = name.data();
     }
     ~TemporaryFile() {
-        for (const char* suffix : {"", "-journal", "-wal", "-shm"}) unlink((name_ + suffix).c_str());
+        unlink(name_.c_str());
+        for (const char* suffix : kSideFileSuffixes) unlink((name_ + suffix).c_str());
     }
     TemporaryFile(const TemporaryFile&) = delete;
     TemporaryFile& operator=(const TemporaryFile&) = delete;
@@ -251,12 +293,23 @@ std::unique_ptr<HostStore> HostStore::Build(const std::string& path, const Json&
         // file alone holds the whole store when it is linked.
         db.Exec("PRAGMA journal_mode = WAL");
     }
-    if (link(temporary.Name().c_str(), path.c_str()) != 0) {
+    bool linked = false;
+    {
+        // Side files are stale only while the store does not exist; the
+        // lock keeps another creator from linking its store, and starting
+        // its log, between the look and the removal.
+        DirectoryLock lock(ParentDirectory(path));
+        if (!PathExists(path)) {
+            RemoveStaleSideFiles(path);
+            linked = link(temporary.Name().c_str(), path.c_str()) == 0;
+            if (!linked && errno != EEXIST) throw StoreError(SystemError(path, "cannot be created"));
+        }
+    }
+    if (!linked) {
         // Another process created the store first; its file is complete,
         // since it too was linked only once built.
-        if (errno == EEXIST && openIfExists) return Open(path);
-        throw StoreError(errno == EEXIST ? Sql::Describe(path, "exists already")
-                                         : SystemError(path, "cannot be created"));
+        if (openIfExists) return Open(path);
+        throw StoreError(Sql::Describe(path, "exists already"));
     }
     SyncDirectory(ParentDirectory(path));
     return Open(path);
