@@ -42,6 +42,15 @@ std::string ParentDirectory(const std::string& path) {
     return slash == 0 ? "/" : path.substr(0, slash);
 }
 
+// A path whose last component is empty, "." or ".." names a directory:
+// creating a store there would only make directories and then fail.
+void RequireFileName(const std::string& path) {
+    const std::string name = path.substr(path.rfind('/') + 1);
+    if (name.empty() || name == "." || name == "..") {
+        throw StoreError(Sql::Describe(path, "cannot be created: the path names a directory, not a file"));
+    }
+}
+
 // Like mkdir -p, but private: the store is one user's host.
 void MakeParentDirectories(const std::string& path) {
     const std::string parent = ParentDirectory(path);
@@ -273,6 +282,7 @@ std::unique_ptr<HostStore> HostStore::Open(const std::string& path) {
 
 std::unique_ptr<HostStore> HostStore::Build(const std::string& path, const Json& profile, const std::string& origin,
                                             bool openIfExists) {
+    RequireFileName(path);
     ValidateProfile(profile);
     MakeParentDirectories(path);
     TemporaryFile temporary(path);

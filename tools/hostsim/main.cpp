@@ -126,6 +126,8 @@ int FaultAdd(const Arguments& args) {
         fault.remaining = std::strtoll(count.c_str(), &end, 10);
         if (count.empty() || *end != '\0' || errno != 0) throw UsageError("--count: '" + count + "' is not an integer");
     }
+    // Bad arguments are refused before a missing store is created.
+    PldCtl::Store::CheckFaultArguments(fault);
     std::cout << HostStore::Default().AddFault(fault) << '\n';
     return kOk;
 }

@@ -111,6 +111,12 @@ struct Fault {
     std::optional<std::int64_t> remaining;
 };
 
+// Throws std::invalid_argument when a fault cannot be armed: its operation
+// is not "Class::Operation", or its count is below 1. AddFault checks the
+// same; a tool calls this first to refuse bad arguments before it opens, and
+// perhaps creates, a store.
+void CheckFaultArguments(const Fault& fault);
+
 class HostStore;
 
 // A test on one top-level field of stored objects, for counting them without
