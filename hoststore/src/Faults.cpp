@@ -78,13 +78,17 @@ std::vector<Fault> HostStore::ListFaults() {
     return faults;
 }
 
-std::int64_t HostStore::AddFault(const Fault& fault) {
+void CheckFaultArguments(const Fault& fault) {
     if (!IsOperationName(fault.operation)) {
         throw std::invalid_argument("fault operation '" + fault.operation + "' must look like Class::Operation");
     }
     if (fault.remaining && *fault.remaining < 1) {
         throw std::invalid_argument("a fault's count must be at least 1, not " + std::to_string(*fault.remaining));
     }
+}
+
+std::int64_t HostStore::AddFault(const Fault& fault) {
+    CheckFaultArguments(fault);
     std::int64_t id = 0;
     impl_->Run(Impl::Mode::Writing, [&] {
         impl_->db.Prepare("INSERT INTO fault(operation, key, message, remaining) VALUES (?1, ?2, ?3, ?4)")

@@ -3,6 +3,7 @@
 // Creating builds the whole database under a temporary name and links it
 // into place, so the final name never shows a half-built store.
 #include <fcntl.h>
+#include <sys/file.h>
 #include <sys/stat.h>
 #include <unistd.h>
 
@@ -21,8 +22,8 @@ namespace {
 
 constexpr std::int64_t kApplicationId = 0x4F525658;  // "ORVX"
 
-std::string Damaged(const std::string& path) {
-    return Sql::Describe(path, "is not an SQLite database or is damaged");
+UnusableFileError Damaged(const std::string& path) {
+    return UnusableFileError(Sql::Describe(path, "is not an SQLite database or is damaged"));
 }
 
 std::string SystemError(const std::string& path, const std::string& what) {
@@ -39,6 +40,15 @@ std::string ParentDirectory(const std::string& path) {
     const auto slash = path.rfind('/');
     if (slash == std::string::npos) return ".";
     return slash == 0 ? "/" : path.substr(0, slash);
+}
+
+// A path whose last component is empty, "." or ".." names a directory:
+// creating a store there would only make directories and then fail.
+void RequireFileName(const std::string& path) {
+    const std::string name = path.substr(path.rfind('/') + 1);
+    if (name.empty() || name == "." || name == "..") {
+        throw StoreError(Sql::Describe(path, "cannot be created: the path names a directory, not a file"));
+    }
 }
 
 // Like mkdir -p, but private: the store is one user's host.
@@ -61,6 +71,46 @@ void SyncDirectory(const std::string& directory) {
     close(fd);
 }
 
+// The files SQLite keeps beside a database: its write-ahead log, the log's
+// shared-memory index and its rollback journal.
+constexpr const char* kSideFileSuffixes[] = {"-wal", "-shm", "-journal"};
+
+// Holds an exclusive lock on a directory for one scope, so that processes
+// creating stores in it take turns between looking for the store and linking
+// a new one into place. A directory that cannot be opened for reading is not
+// locked; creating still works, only without that protection.
+class DirectoryLock {
+public:
+    explicit DirectoryLock(const std::string& directory)
+        : fd_(open(directory.c_str(), O_RDONLY | O_DIRECTORY | O_CLOEXEC)) {
+        if (fd_ >= 0) {
+            while (flock(fd_, LOCK_EX) != 0 && errno == EINTR) {
+            }
+        }
+    }
+    ~DirectoryLock() {
+        if (fd_ >= 0) close(fd_);
+    }
+    DirectoryLock(const DirectoryLock&) = delete;
+    DirectoryLock& operator=(const DirectoryLock&) = delete;
+
+private:
+    int fd_;
+};
+
+// Removes the side files a store that no longer exists left at path (a
+// process died with it open, then the file was removed). SQLite would take
+// them for the new file's own and replay the dead store's log into it. A
+// process still holding them keeps only unlinked files that nobody shares.
+void RemoveStaleSideFiles(const std::string& path) {
+    for (const char* suffix : kSideFileSuffixes) {
+        const std::string file = path + suffix;
+        if (unlink(file.c_str()) != 0 && errno != ENOENT) {
+            throw StoreError(SystemError(path, "cannot be created: the stale file '" + file + "' cannot be removed"));
+        }
+    }
+}
+
 // A uniquely named empty file beside the store; it and any SQLite side file
 // are removed when it goes out of scope, after linking as after a failure.
 class TemporaryFile {
@@ -76,7 +126,8 @@ public:
         name_ = name.data();
     }
     ~TemporaryFile() {
-        for (const char* suffix : {"", "-journal", "-wal", "-shm"}) unlink((name_ + suffix).c_str());
+        unlink(name_.c_str());
+        for (const char* suffix : kSideFileSuffixes) unlink((name_ + suffix).c_str());
     }
     TemporaryFile(const TemporaryFile&) = delete;
     TemporaryFile& operator=(const TemporaryFile&) = delete;
@@ -154,7 +205,7 @@ void Configure(Sql::Database& db) {
 // the columns the object table has, less the section. A file without a
 // schema version was never a whole store.
 void Migrate(Sql::Database& db, std::int64_t version) {
-    if (version < 1) throw StoreError(Sql::Describe(db.Path(), "has no schema version; it is damaged"));
+    if (version < 1) throw UnusableFileError(Sql::Describe(db.Path(), "has no schema version; it is damaged"));
     db.Exec("BEGIN IMMEDIATE");
     try {
         // Another process may have upgraded the file meanwhile.
@@ -175,31 +226,27 @@ void Migrate(Sql::Database& db, std::int64_t version) {
 }
 
 // Everything that can be learnt about the file without writing to it;
-// returns its schema version.
+// returns its schema version. The first read reports a file that is not a
+// database as damaged (UnusableFileError); any other failure, such as a log
+// that cannot be created or a full disk, as what it is.
 std::int64_t Verify(Sql::Database& db, off_t size) {
     const std::string& path = db.Path();
-    std::int64_t applicationId = 0;
-    try {
-        applicationId = db.Integer("PRAGMA application_id");
-    } catch (const Sql::BusyError&) {
-        throw;
-    } catch (const StoreError&) {
-        throw StoreError(Damaged(path));
-    }
+    const std::int64_t applicationId = db.Integer("PRAGMA application_id");
     if (applicationId != kApplicationId) {
-        throw StoreError(Sql::Describe(path, "is an SQLite database of another application, not a host store"));
+        throw UnusableFileError(Sql::Describe(path, "is an SQLite database of another application, not a host store"));
     }
     const std::int64_t version = db.Integer("PRAGMA user_version");
     if (version > kSchemaVersion) {
-        throw StoreError(Sql::Describe(path, "was written by a newer version (schema " + std::to_string(version) +
-                                                 ", this build reads up to " + std::to_string(kSchemaVersion) + ")"));
+        throw UnusableFileError(Sql::Describe(path, "was written by a newer version (schema " +
+                                                        std::to_string(version) + ", this build reads up to " +
+                                                        std::to_string(kSchemaVersion) + ")"));
     }
     // Pages that live only in the write-ahead log make the file legitimately
     // shorter than the database; without one, a short file lost its end.
     if (FileSize(path + "-wal") <= 0) {
         const std::int64_t expected = db.Integer("PRAGMA page_count") * db.Integer("PRAGMA page_size");
         if (size < expected) {
-            throw StoreError(Sql::Describe(
+            throw UnusableFileError(Sql::Describe(
                 path, "is truncated (" + std::to_string(size) + " bytes of " + std::to_string(expected) + ")"));
         }
     }
@@ -210,7 +257,11 @@ std::int64_t Verify(Sql::Database& db, off_t size) {
 
 bool PathExists(const std::string& path) {
     struct stat st {};
-    return lstat(path.c_str(), &st) == 0;
+    if (lstat(path.c_str(), &st) == 0) return true;
+    // A file that cannot be looked at may well exist: it must not be taken
+    // for a missing store and created anew.
+    if (errno == ENOENT || errno == ENOTDIR) return false;
+    throw StoreError(SystemError(path, "cannot be opened"));
 }
 
 std::unique_ptr<HostStore> HostStore::Open(const std::string& path) {
@@ -221,7 +272,7 @@ std::unique_ptr<HostStore> HostStore::Open(const std::string& path) {
     }
     if (!S_ISREG(st.st_mode)) throw StoreError(Sql::Describe(path, "is not a regular file"));
     // SQLite takes an empty file for a new database and would write one in it.
-    if (st.st_size == 0) throw StoreError(Damaged(path));
+    if (st.st_size == 0) throw Damaged(path);
     std::unique_ptr<HostStore> store(new HostStore(path));
     const std::int64_t version = Verify(store->impl_->db, st.st_size);
     Configure(store->impl_->db);
@@ -230,11 +281,12 @@ std::unique_ptr<HostStore> HostStore::Open(const std::string& path) {
 }
 
 std::unique_ptr<HostStore> HostStore::Build(const std::string& path, const Json& profile, const std::string& origin,
-                                            bool openIfExists) {
+                                            Existing existing) {
+    RequireFileName(path);
     ValidateProfile(profile);
     MakeParentDirectories(path);
     TemporaryFile temporary(path);
-    {
+    try {
         HostStore building(temporary.Name());
         Sql::Database& db = building.impl_->db;
         Configure(db);
@@ -250,13 +302,41 @@ std::unique_ptr<HostStore> HostStore::Build(const std::string& path, const Json&
         // after switching leaves an empty log, which SQLite removes, so the
         // file alone holds the whole store when it is linked.
         db.Exec("PRAGMA journal_mode = WAL");
+    } catch (const StoreError& e) {
+        // The temporary file is the program's business; the user learns
+        // which store could not be made, and why.
+        std::string cause = e.what();
+        for (const std::string& prefix : {Sql::Describe(temporary.Name(), ""), std::string("cannot be used: ")}) {
+            if (cause.rfind(prefix, 0) == 0) cause.erase(0, prefix.size());
+        }
+        throw StoreError(Sql::Describe(path, "cannot be created: " + cause));
     }
-    if (link(temporary.Name().c_str(), path.c_str()) != 0) {
+    bool placed = false;
+    {
+        // Side files are stale only while no good store exists at path; the
+        // lock keeps another creator from linking its store, and starting
+        // its log, between the look and the removal.
+        DirectoryLock lock(ParentDirectory(path));
+        if (existing == Existing::Replace) {
+            // The refused file's side files go first, so that the new file
+            // never meets them; the file itself stays as it was until the
+            // new one takes its name in one rename.
+            RemoveStaleSideFiles(path);
+            if (rename(temporary.Name().c_str(), path.c_str()) != 0) {
+                throw StoreError(SystemError(path, "cannot be replaced"));
+            }
+            placed = true;
+        } else if (!PathExists(path)) {
+            RemoveStaleSideFiles(path);
+            placed = link(temporary.Name().c_str(), path.c_str()) == 0;
+            if (!placed && errno != EEXIST) throw StoreError(SystemError(path, "cannot be created"));
+        }
+    }
+    if (!placed) {
         // Another process created the store first; its file is complete,
         // since it too was linked only once built.
-        if (errno == EEXIST && openIfExists) return Open(path);
-        throw StoreError(errno == EEXIST ? Sql::Describe(path, "exists already")
-                                         : SystemError(path, "cannot be created"));
+        if (existing == Existing::Open) return Open(path);
+        throw StoreError(Sql::Describe(path, "exists already"));
     }
     SyncDirectory(ParentDirectory(path));
     return Open(path);
@@ -264,12 +344,16 @@ std::unique_ptr<HostStore> HostStore::Build(const std::string& path, const Json&
 
 std::unique_ptr<HostStore> HostStore::Create(const std::string& path, const Json& profile, const std::string& origin) {
     if (PathExists(path)) throw StoreError(Sql::Describe(path, "exists already"));
-    return Build(path, profile, origin, false);
+    return Build(path, profile, origin, Existing::Refuse);
+}
+
+std::unique_ptr<HostStore> HostStore::Replace(const std::string& path, const Json& profile, const std::string& origin) {
+    return Build(path, profile, origin, Existing::Replace);
 }
 
 std::unique_ptr<HostStore> HostStore::OpenOrCreate(const std::string& path, const Json& profile,
                                                    const std::string& origin) {
-    return PathExists(path) ? Open(path) : Build(path, profile, origin, true);
+    return PathExists(path) ? Open(path) : Build(path, profile, origin, Existing::Open);
 }
 
 namespace {
@@ -289,7 +373,7 @@ std::unique_ptr<HostStore> HostStore::Create(const std::string& path, const std:
 std::unique_ptr<HostStore> HostStore::OpenOrCreate(const std::string& path, const std::string& profileText) {
     if (PathExists(path)) return Open(path);
     const std::string origin = TextOrigin(path);
-    return Build(path, ParseProfile(profileText, origin), origin, true);
+    return Build(path, ParseProfile(profileText, origin), origin, Existing::Open);
 }
 
 }  // namespace Store

@@ -2,6 +2,8 @@
 
 #include <sqlite3.h>
 
+#include <cstring>
+
 namespace PldCtl {
 namespace Store {
 namespace Sql {
@@ -26,6 +28,19 @@ void InitialiseSqlite() {
     if (initialised != SQLITE_OK) {
         throw StoreError("SQLite cannot be initialised: " + std::string(sqlite3_errstr(initialised)));
     }
+}
+
+// SQLite's account of a failure, with the system's reason when the failure
+// came from the operating system (a permission, a full disk, an I/O error).
+std::string Cause(sqlite3* db, int code) {
+    std::string cause = db ? sqlite3_errmsg(db) : sqlite3_errstr(code);
+    const int systemError = db ? sqlite3_system_errno(db) : 0;
+    if (systemError != 0) cause += std::string(": ") + std::strerror(systemError);
+    // A store opened read-only because its file, or its directory where the
+    // log files would go, is not writable for this user.
+    if ((code & 0xff) == SQLITE_READONLY)
+        cause += " (the file, its -wal and -shm files or its directory are not writable)";
+    return cause;
 }
 
 }  // namespace
@@ -98,7 +113,7 @@ Database::Database(const std::string& path) : path_(path) {
     InitialiseSqlite();
     int rc = sqlite3_open_v2(path.c_str(), &db_, SQLITE_OPEN_READWRITE, nullptr);
     if (rc != SQLITE_OK) {
-        std::string message = db_ ? sqlite3_errmsg(db_) : sqlite3_errstr(rc);
+        const std::string message = Cause(db_, rc);
         sqlite3_close(db_);
         db_ = nullptr;
         throw StoreError(Describe(path, "cannot be opened: " + message));
@@ -161,9 +176,9 @@ void Database::Fail(int code) const {
             throw BusyError(Describe(path_, "is busy: " + std::string(sqlite3_errmsg(db_))));
         case SQLITE_CORRUPT:
         case SQLITE_NOTADB:
-            throw StoreError(Describe(path_, "is not an SQLite database or is damaged"));
+            throw UnusableFileError(Describe(path_, "is not an SQLite database or is damaged"));
         default:
-            throw StoreError(Describe(path_, "cannot be used: " + std::string(sqlite3_errmsg(db_))));
+            throw StoreError(Describe(path_, "cannot be used: " + Cause(db_, code)));
     }
 }
 

@@ -42,10 +42,6 @@ std::optional<std::string> FieldText(const Json& object, const char* field);
 
 bool IsSingleton(const std::string& name);
 
-// Whether anything, even a dangling link, has this name: creating a store
-// never replaces what is there.
-bool PathExists(const std::string& path);
-
 // A stored object; a document that is not JSON means a damaged store.
 Json ParseDoc(const Sql::Database& db, const std::string& text);
 

@@ -112,6 +112,10 @@ TEST_F(HostsimTest, UsageErrorsAndHelp) {
     EXPECT_EQ(Failure({"init", "--force", "--force"}, 2), "orvix-hostsim: --force given twice\n");
     EXPECT_EQ(RunBare({"--db"}).err, "orvix-hostsim: --db needs a value\n");
     EXPECT_EQ(RunBare({"--verbose", "dump"}).err, "orvix-hostsim: unknown option '--verbose'\n");
+    EXPECT_EQ(Failure({"fault", "add", "notanop", "--message", "x"}, 2),
+              "orvix-hostsim: fault operation 'notanop' must look like Class::Operation\n");
+    EXPECT_EQ(Failure({"fault", "add", "A::B", "--message", "x", "--count", "0"}, 2),
+              "orvix-hostsim: a fault's count must be at least 1, not 0\n");
     // Nothing was created by any of them.
     EXPECT_FALSE(std::filesystem::exists(db));
 
@@ -120,6 +124,27 @@ TEST_F(HostsimTest, UsageErrorsAndHelp) {
     EXPECT_EQ(addHelp.out.rfind(
                   "Usage: orvix-hostsim [--db PATH] fault add OPERATION [--key KEY] --message TEXT [--count N]\n", 0),
               0u);
+}
+
+// A store path that names a directory is refused by both tools, naming the
+// path, before any directory on the way is made.
+TEST_F(HostsimTest, AStorePathNamingADirectoryCreatesNothing) {
+    for (const std::string& path : {dir / "some/dir/", dir / "some/dir/.", dir / "some/.."}) {
+        SCOPED_TRACE(path);
+        const std::string problem =
+            "host store '" + path + "' cannot be created: the path names a directory, not a file\n";
+        const Result dump = RunBare({"--db", path, "dump"});
+        EXPECT_EQ(dump.status, 3);
+        EXPECT_EQ(dump.err, "orvix-hostsim: " + problem);
+
+        std::vector<std::string> env = {"PATH=/usr/bin:/bin", "HOME=" + dir.Path(), "ORVIX_HOST_DB=" + path,
+                                        "ORVIX_PLUGIN_PATH=" + std::string(ORVIX_PLUGIN_DIR)};
+        for (const auto& setting : OrvixTest::SanitizerEnvironment()) env.push_back(setting);
+        const auto cli = OrvixTest::RunProcess({OrvixTest::Bin("orvixcli"), "network", "ip", "get"}, dir.Path(), env);
+        EXPECT_EQ(cli.status, 3);
+        EXPECT_EQ(cli.err, "orvixcli: " + problem);
+        EXPECT_FALSE(std::filesystem::exists(dir / "some"));
+    }
 }
 
 TEST_F(HostsimTest, PathFollowsOptionAndEnvironment) {

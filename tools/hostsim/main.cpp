@@ -1,12 +1,9 @@
 // orvix-hostsim: creates a simulated host from a profile, shows it as one,
 // replaces it, and arms the faults that tests use to reach error paths.
-#include <sys/stat.h>
-#include <unistd.h>
 
 #include <algorithm>
 #include <cerrno>
 #include <cstdlib>
-#include <cstring>
 #include <iostream>
 #include <map>
 #include <stdexcept>
@@ -65,36 +62,27 @@ struct Command {
     int (*run)(const Arguments& args);
 };
 
-bool Exists(const std::string& path) {
-    struct stat st {};
-    return lstat(path.c_str(), &st) == 0;
-}
-
 int Init(const Arguments& args) {
     const std::string origin = args.Has("profile") ? args.Get("profile") : HostStore::ResolveProfileOrigin();
     const std::string text =
         args.Has("profile") ? PldCtl::Store::ReadProfileFile(origin) : HostStore::ResolveProfileText();
     const Json profile = PldCtl::Store::ParseProfile(text, origin);
     const std::string path = HostStore::ResolvePath();
-    if (Exists(path)) {
+    if (PldCtl::Store::PathExists(path)) {
         if (!args.Has("force")) throw RequestError("host store '" + path + "' exists; use --force to replace it");
         std::unique_ptr<HostStore> store;
         try {
             store = HostStore::Open(path);
-        } catch (const PldCtl::Store::StoreError& e) {
+        } catch (const PldCtl::Store::UnusableFileError& e) {
+            // Only a file found not to be a usable store is replaced; one
+            // that cannot be read now (rights, a full disk) stays as it is.
             std::cerr << "orvix-hostsim: " << e.what() << "; replacing it\n";
-            for (const char* suffix : {"", "-wal", "-shm", "-journal"}) {
-                const std::string file = path + suffix;
-                if (unlink(file.c_str()) != 0 && errno != ENOENT) {
-                    throw PldCtl::Store::StoreError("cannot remove '" + file + "': " + std::strerror(errno));
-                }
-            }
-        }
-        if (store) {
-            store->Load(profile);
-            store->ClearFaults();
+            HostStore::Replace(path, profile, origin);
             return kOk;
         }
+        store->Load(profile);
+        store->ClearFaults();
+        return kOk;
     }
     HostStore::Create(path, profile, origin);
     return kOk;
@@ -126,6 +114,8 @@ int FaultAdd(const Arguments& args) {
         fault.remaining = std::strtoll(count.c_str(), &end, 10);
         if (count.empty() || *end != '\0' || errno != 0) throw UsageError("--count: '" + count + "' is not an integer");
     }
+    // Bad arguments are refused before a missing store is created.
+    PldCtl::Store::CheckFaultArguments(fault);
     std::cout << HostStore::Default().AddFault(fault) << '\n';
     return kOk;
 }
@@ -173,7 +163,7 @@ const std::vector<Command>& Commands() {
          "create the store from a profile",
          "Creates the store from FILE, else from $ORVIX_HOST_PROFILE, else from the embedded default host.\n"
          "An existing store is kept unless --force is given: then a good store is replaced by the profile\n"
-         "and its faults are cleared, and a damaged one is removed and created anew.",
+         "and its faults are cleared, and a damaged one is replaced by a new one.",
          Init},
         {"dump",
          {},

@@ -43,6 +43,16 @@ public:
     using std::runtime_error::runtime_error;
 };
 
+// The file was read and found not to be a usable host store: it is not an
+// SQLite database, is damaged or truncated, belongs to another application
+// or was written by a newer version. Only such a file may be replaced by a
+// forced init; a store that merely cannot be read now (permissions, a full
+// disk, an I/O error, a lock) is a plain StoreError.
+class UnusableFileError : public StoreError {
+public:
+    using StoreError::StoreError;
+};
+
 // An injected fault fired (see HostStore::CheckFault). what() is the
 // fault's message, which the library reports as the operation's own failure.
 class InjectedFault : public std::runtime_error {
@@ -110,6 +120,17 @@ struct Fault {
     std::string message;
     std::optional<std::int64_t> remaining;
 };
+
+// Throws std::invalid_argument when a fault cannot be armed: its operation
+// is not "Class::Operation", or its count is below 1. AddFault checks the
+// same; a tool calls this first to refuse bad arguments before it opens, and
+// perhaps creates, a store.
+void CheckFaultArguments(const Fault& fault);
+
+// Whether anything, even a dangling link, has this name: creating a store
+// never replaces what is there. Throws StoreError when that cannot be
+// known (no right to search a directory on the way).
+bool PathExists(const std::string& path);
 
 class HostStore;
 
@@ -229,6 +250,11 @@ public:
     static std::unique_ptr<HostStore> OpenOrCreate(const std::string& path, const Json& profile,
                                                    const std::string& origin);
     static std::unique_ptr<HostStore> Create(const std::string& path, const Json& profile, const std::string& origin);
+    // Puts a new store from the profile in place of the file at path (one
+    // that Open refused with UnusableFileError), removing that file's side
+    // files: the new store is built completely beside it and renamed over it
+    // in one step. When building fails, the file at path is left untouched.
+    static std::unique_ptr<HostStore> Replace(const std::string& path, const Json& profile, const std::string& origin);
 
     ~HostStore();
     HostStore(const HostStore&) = delete;
@@ -282,11 +308,14 @@ private:
     friend class Transaction;
     struct Impl;
     explicit HostStore(const std::string& path);
+    // What Build does when a file is at path once the new store is built.
+    enum class Existing { Open, Refuse, Replace };
     // Builds a complete store in a temporary file beside path and links it
-    // to path. When path appeared meanwhile, opens that one (openIfExists) or
-    // throws StoreError.
+    // to path, or renames it over the file there (Existing::Replace). When a
+    // store appeared at path meanwhile, opens that one (Existing::Open) or
+    // throws StoreError (Existing::Refuse).
     static std::unique_ptr<HostStore> Build(const std::string& path, const Json& profile, const std::string& origin,
-                                            bool openIfExists);
+                                            Existing existing);
     std::string path_;
     std::unique_ptr<Impl> impl_;
 };
