@@ -4,11 +4,14 @@
 
 #include <algorithm>
 #include <cerrno>
+#include <cmath>
+#include <cstdlib>
 #include <cstring>
 #include <fstream>
 #include <sstream>
 #include <unordered_map>
 
+#include "ProfileChecks.h"
 #include "StoreImpl.h"
 
 namespace PldCtl {
@@ -25,12 +28,12 @@ constexpr off_t kMaxProfileBytes = off_t(256) << 20;
 // document (copying, writing, comparing, all recursive) to a small stack.
 constexpr int kMaxProfileDepth = 64;
 
-// Refuses a text whose arrays and objects nest deeper than kMaxProfileDepth,
-// before a document is built from it. The scan does not recurse, so a
-// hostile file cannot exhaust the stack here either; it skips strings, and
-// leaves every other error to the parser.
-void CheckDepth(const std::string& text, const std::string& label) {
-    int depth = 0;
+// Calls fn(i, place) for each character of a JSON text outside its strings
+// (quotes included, newlines excluded), where place is "line L, column C";
+// fn may advance i past characters it consumed, and stops the scan by
+// returning true. The scan does not recurse and builds no document.
+template <typename Fn>
+void ScanOutsideStrings(const std::string& text, Fn fn) {
     bool inString = false;
     std::size_t line = 1;
     std::size_t lineStart = 0;
@@ -42,21 +45,52 @@ void CheckDepth(const std::string& text, const std::string& label) {
             } else if (c == '"') {
                 inString = false;
             }
-        } else if (c == '"') {
-            inString = true;
         } else if (c == '\n') {
             ++line;
             lineStart = i + 1;
-        } else if (c == '[' || c == '{') {
-            if (++depth > kMaxProfileDepth) {
-                throw ProfileError(label + ": nested deeper than " + std::to_string(kMaxProfileDepth) +
-                                   " levels at line " + std::to_string(line) + ", column " +
-                                   std::to_string(i - lineStart + 1));
-            }
-        } else if (c == ']' || c == '}') {
-            --depth;
+        } else {
+            if (c == '"') inString = true;
+            auto place = [&] {
+                return "line " + std::to_string(line) + ", column " + std::to_string(i - lineStart + 1);
+            };
+            if (fn(i, place)) return;
         }
     }
+}
+
+// Refuses a text whose arrays and objects nest deeper than kMaxProfileDepth,
+// before a document is built from it, so a hostile file cannot exhaust the
+// stack. Every other error is left to the parser.
+void CheckDepth(const std::string& text, const std::string& label) {
+    int depth = 0;
+    ScanOutsideStrings(text, [&](std::size_t& i, const auto& place) {
+        if (text[i] == '[' || text[i] == '{') {
+            if (++depth > kMaxProfileDepth) {
+                throw ProfileError(label + ": nested deeper than " + std::to_string(kMaxProfileDepth) + " levels at " +
+                                   place());
+            }
+        } else if (text[i] == ']' || text[i] == '}') {
+            --depth;
+        }
+        return false;
+    });
+}
+
+// Where the first number beyond a double's range is, which is what the
+// parser refuses without saying where.
+std::string TooLargeNumberPlace(const std::string& text) {
+    std::string found = "an unknown place";
+    ScanOutsideStrings(text, [&](std::size_t& i, const auto& place) {
+        if (text[i] != '-' && (text[i] < '0' || text[i] > '9')) return false;
+        const std::size_t end = std::min(text.find_first_not_of("+-.0123456789eE", i), text.size());
+        if (std::isinf(std::strtod(text.substr(i, end - i).c_str(), nullptr))) {
+            found = place();
+            return true;
+        }
+        i = end - 1;
+        return false;
+    });
+    return found;
 }
 
 const CollectionInfo* FindCollection(const std::string& section) {
@@ -100,6 +134,16 @@ void CheckReferences(const CollectionInfo& collection, const Json& objects,
     }
 }
 
+// The types and ranges of the fields the library reads (ProfileChecks.h).
+template <typename Fail>
+void CheckFieldsOf(const std::string& section, const Json& value, Fail fail) {
+    try {
+        CheckSectionFields(section, value);
+    } catch (const ProfileError& e) {
+        fail(e.what());
+    }
+}
+
 // label starts every message: "profile <origin>".
 void Validate(const Json& profile, const std::string& label) {
     auto fail = [&label](const std::string& what) { throw ProfileError(label + ": " + what); };
@@ -122,6 +166,7 @@ void Validate(const Json& profile, const std::string& label) {
         if (name == "format" || name == "version") continue;
         if (IsSingleton(name)) {
             if (!value.is_object()) fail(name + ": must be a JSON object");
+            CheckFieldsOf(name, value, fail);
             continue;
         }
         const CollectionInfo* collection = FindCollection(name);
@@ -135,6 +180,7 @@ void Validate(const Json& profile, const std::string& label) {
                 fail(name + "[" + std::to_string(i) + "]: " + e.what());
             }
         }
+        CheckFieldsOf(name, value, fail);
     }
     for (const auto& collection : Collections()) {
         const auto objects = profile.find(collection.section);
@@ -184,6 +230,10 @@ Json ParseProfile(const std::string& text, const std::string& origin) {
         const auto end = message.find("] ");
         if (message.front() == '[' && end != std::string::npos) message.erase(0, end + 2);
         throw ProfileError(label + ": " + message);
+    } catch (const Json::out_of_range&) {
+        // The parser reports a number beyond a double's range (out_of_range
+        // 406) only with the number's text; it is placed here instead.
+        throw ProfileError(label + ": a number is too large at " + TooLargeNumberPlace(text));
     }
     Validate(profile, label);
     return profile;

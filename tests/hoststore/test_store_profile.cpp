@@ -83,6 +83,62 @@ TEST(ProfileTest, KeyAndParentErrors) {
               "(accepted)");
 }
 
+TEST(ProfileTest, FieldsTheLibraryReadsKeepTheirTypeAndRange) {
+    // Counts that would overflow the host-wide sum of ports.
+    EXPECT_EQ(ErrorOf(WithSections(R"("vswitches": [{"name": "a", "numPorts": 18446744073709551615}])")),
+              "profile t.json: vswitches[0].numPorts: must be an integer from 1 to 4096, not 18446744073709551615");
+    EXPECT_EQ(ErrorOf(WithSections(R"("dvswitches": [{"name": "d", "numPorts": 0}])")),
+              "profile t.json: dvswitches[0].numPorts: must be an integer from 1 to 4096, not 0");
+    EXPECT_EQ(ErrorOf(WithSections(R"("system": {"maxPorts": -1})")),
+              "profile t.json: system.maxPorts: must be an integer from 1 to 9223372036854775807, not -1");
+    // Values of another type, which the library would read as defaults.
+    EXPECT_EQ(ErrorOf(WithSections(R"("vswitches": [{"name": "a"}],
+                                      "portgroups": [{"name": "p", "vswitch": "a", "vlanId": 0},
+                                                     {"name": "q", "vswitch": "a", "vlanId": "20"}])")),
+              "profile t.json: portgroups[1].vlanId: must be an integer from 0 to 4095, not string");
+    EXPECT_EQ(ErrorOf(WithSections(R"("vswitches": [{"name": "a", "uplinks": ["hwnic0", 2]}])")),
+              "profile t.json: vswitches[0].uplinks: item 1 must be a string, not 2");
+    EXPECT_EQ(ErrorOf(WithSections(R"("system": {"ipv6Enabled": "no"})")),
+              "profile t.json: system.ipv6Enabled: must be true or false, not string");
+    EXPECT_EQ(ErrorOf(WithSections(R"("vswitches": [{"name": "a", "cdp": null}])")),
+              "profile t.json: vswitches[0].cdp: must be one of down, listen, advertise, both, not null");
+    EXPECT_EQ(ErrorOf(WithSections(R"("ports": [{"id": 1, "portset": "a", "type": "nic"}])")),
+              "profile t.json: ports[0].type: must be one of vm, kernel, uplink, internal, not 'nic'");
+    EXPECT_EQ(ErrorOf(WithSections(R"("nics": [{"name": "hwnic0", "uplinkPortId": -1}])")),
+              "profile t.json: nics[0].uplinkPortId: must be an integer from 0 to 9223372036854775807, not -1");
+    // Policies and other nested objects are checked field by field.
+    EXPECT_EQ(ErrorOf(WithSections(R"("vswitches": [{"name": "a"}],
+                                      "portgroups": [{"name": "p", "vswitch": "a",
+                                                      "teaming": {"loadBalancing": "fast"}}])")),
+              "profile t.json: portgroups[0].teaming.loadBalancing: must be one of iphash, srcmac, srcport, "
+              "explicit, not 'fast'");
+    EXPECT_EQ(ErrorOf(WithSections(R"("vswitches": [{"name": "a", "shaping": {"peakBps": 1.5}}])")),
+              "profile t.json: vswitches[0].shaping.peakBps: must be an integer from 0 to 18446744073709551615, "
+              "not 1.5");
+    EXPECT_EQ(ErrorOf(WithSections(R"("vswitches": [{"name": "a", "beacon": {"interval": true}}])")),
+              "profile t.json: vswitches[0].beacon.interval: must be an integer from 0 to 2147483647, not boolean");
+    EXPECT_EQ(ErrorOf(WithSections(R"("vswitches": [{"name": "a", "security": [true]}])")),
+              "profile t.json: vswitches[0].security: must be a JSON object, not array");
+    // The edges of each range, whole numbers however written, and fields the
+    // library does not read.
+    EXPECT_EQ(ErrorOf(WithSections(R"("vswitches": [{"name": "a", "mtu": 1279}])")),
+              "profile t.json: vswitches[0].mtu: must be an integer from 1280 to 9000, not 1279");
+    EXPECT_EQ(ErrorOf(WithSections(R"("system": {"ipv6Enabled": false, "maxPorts": 4.608e3, "rack": "x"},
+                                      "vswitches": [{"name": "a", "numPorts": 4096, "mtu": 9000.0, "owner": 7,
+                                                     "shaping": {"averageBps": 18446744073709551615}}],
+                                      "portgroups": [{"name": "p", "vswitch": "a", "vlanId": 4095}],
+                                      "ports": [{"id": 9223372036854775807, "portset": "a", "type": "uplink"}])")),
+              "(accepted)");
+}
+
+TEST(ProfileTest, NumbersBeyondTheParserAreRefusedWithTheirPlace) {
+    const std::string huge = "1" + std::string(400, '0');
+    const std::string message = ErrorOf(WithSections("\n\"system\": {\"x\": \"9e999\", \"maxPorts\": " + huge + "}"));
+    EXPECT_EQ(message, "profile t.json: a number is too large at line 2, column 38");
+    EXPECT_EQ(ErrorOf(WithSections("\"system\": {\"x\": -" + huge + "}")),
+              "profile t.json: a number is too large at line 1, column 64");
+}
+
 TEST(ProfileTest, ProfileFiles) {
     OrvixTest::TempDir dir;
     const auto read = [](const std::string& file) { return Failure([&] { PldCtl::Store::ReadProfileFile(file); }); };
