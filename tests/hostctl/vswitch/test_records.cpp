@@ -117,6 +117,14 @@ TEST_F(Records, FieldsOfAnotherTypeReadAsTheirDefaultsAndStayAsWritten) {
     EXPECT_EQ(stored["teaming"]["beacon"], "yes");
 }
 
+TEST_F(Records, PortCountsBeyondEveryRangeStillRefuseNewSwitches) {
+    MakeHost(R"("vswitches": [{"name": "huge"}])");
+    RawSql(R"(UPDATE object SET doc = '{"name": "huge", "numPorts": 18446744073709551615}' WHERE key = 'huge')");
+    EXPECT_EQ(AddSwitch(1),
+              "Unable to create virtual switch added with 1 port: 9223372036854775807 of the host's 4608 ports "
+              "are allocated already");
+}
+
 TEST_F(Records, TextIsReadExactlyAndDamagedTextFailsCleanly) {
     MakeHost(R"("vswitches": [{"name": "vSwitch0"}],
                 "portgroups": [{"name": "Quoted \"pg\" \\ /", "vswitch": "vSwitch0"},

@@ -1,4 +1,7 @@
 // The host's standard switches: listing, finding, adding and removing them.
+#include <cstdint>
+#include <limits>
+
 #include "hostctl/Lib.h"
 #include "hostctl/network/vswitch/SwitchImpl.h"
 #include "hostctl/network/vswitch/VswitchTables.h"
@@ -10,6 +13,17 @@ namespace PldCtl {
 namespace Network {
 
 using HostCtl::Network::VirtualSwitch;
+
+namespace {
+
+// a + b, held at the nearest limit of std::int64_t where it would pass one.
+std::int64_t SaturatingAdd(std::int64_t a, std::int64_t b) {
+    std::int64_t sum = 0;
+    if (!__builtin_add_overflow(a, b, &sum)) return sum;
+    return b > 0 ? std::numeric_limits<std::int64_t>::max() : std::numeric_limits<std::int64_t>::min();
+}
+
+}  // namespace
 
 VirtualSwitchInfoImpl::VirtualSwitchInfoImpl() = default;
 
@@ -72,11 +86,14 @@ std::unique_ptr<VirtualSwitch> VirtualSwitchInfoImpl::AddVirtualSwitchWithPolicy
         }
         const std::int64_t limit = Detail::GetSingleton<Detail::SystemRecord>(t).maxPorts;
         // A switch that does not store its number of ports has the default.
+        // Loading a profile keeps each count in range, but a store changed
+        // by other means may hold any number: the sums saturate rather than
+        // overflow, and so refuse the new switch.
         const std::int64_t allocated =
-            t.SumField(VswitchRecord::kSection, VswitchRecord::kNumPortsField, Portset::DEF_NUM_PORTS) +
-            t.SumField(Detail::DvSwitchRecord::kSection, Detail::DvSwitchRecord::kNumPortsField,
-                       Portset::DEF_NUM_PORTS);
-        if (allocated + numPorts > limit) {
+            SaturatingAdd(t.SumField(VswitchRecord::kSection, VswitchRecord::kNumPortsField, Portset::DEF_NUM_PORTS),
+                          t.SumField(Detail::DvSwitchRecord::kSection, Detail::DvSwitchRecord::kNumPortsField,
+                                     Portset::DEF_NUM_PORTS));
+        if (SaturatingAdd(allocated, numPorts) > limit) {
             throw HostCtlException("Unable to create virtual switch " + name + " with " + std::to_string(numPorts) +
                                    (numPorts == 1 ? " port: " : " ports: ") + std::to_string(allocated) +
                                    " of the host's " + std::to_string(limit) + " ports are allocated already");
