@@ -10,6 +10,7 @@ packages=(
   libsqlite3-dev nlohmann-json3-dev
   libgtest-dev libgmock-dev libexpat1-dev
   clang-format
+  clang-14 libclang-rt-14-dev
 )
 
 missing=()
