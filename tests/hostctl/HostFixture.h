@@ -4,8 +4,6 @@
 // other program does: through orvix-hostsim or a connection of its own.
 #pragma once
 
-#include <sqlite3.h>
-
 #include <gtest/gtest.h>
 #include <nlohmann/json.hpp>
 
@@ -19,6 +17,7 @@
 #include "hostctl/network/NetworkFactory.h"
 #include "hostctl/network/vswitch/Policy.h"
 #include "support/process.h"
+#include "support/raw_sql.h"
 #include "support/test_util.h"
 
 class FreshHost : public ::testing::Test {
@@ -73,12 +72,7 @@ protected:
     // SQLite, and two copies must never hold the same file open at once.
     void RawSql(const std::string& sql) const {
         PldCtl::Lib::ReopenHost();
-        sqlite3* db = nullptr;
-        int rc = sqlite3_open_v2(DbPath().c_str(), &db, SQLITE_OPEN_READWRITE, nullptr);
-        if (rc == SQLITE_OK) rc = sqlite3_exec(db, sql.c_str(), nullptr, nullptr, nullptr);
-        const std::string message = sqlite3_errmsg(db);
-        sqlite3_close(db);
-        if (rc != SQLITE_OK) throw std::runtime_error(DbPath() + ": " + message);
+        OrvixTest::RawSql(DbPath(), sql);
     }
 
     // The library's message for a refused operation.

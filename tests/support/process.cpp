@@ -125,14 +125,18 @@ ProcessResult RunProcess(const std::vector<std::string>& argv, const std::string
     return result;
 }
 
-std::vector<std::string> ExportedSymbols(const std::string& library) {
-    const ProcessResult nm = RunProcess({"nm", "-D", "--defined-only", library}, ".", {"PATH=/usr/bin:/bin"});
+std::vector<std::string> ExportedSymbols(const std::string& library, bool demangled) {
+    std::vector<std::string> argv = {"nm", "-D", "--defined-only", library};
+    if (demangled) argv.insert(argv.begin() + 1, "-C");
+    const ProcessResult nm = RunProcess(argv, ".", {"PATH=/usr/bin:/bin"});
     if (nm.status != 0) throw std::runtime_error("nm " + library + " failed: " + nm.err);
     std::vector<std::string> symbols;
     std::istringstream lines(nm.out);
     for (std::string line; std::getline(lines, line);) {
-        // "<address> <kind> <name>"
-        symbols.push_back(line.substr(line.rfind(' ') + 1));
+        // "<address> <kind> <name>"; a demangled C++ name may itself hold blanks.
+        const auto kind = line.find(' ');
+        const auto name = kind == std::string::npos ? kind : line.find(' ', kind + 1);
+        if (name != std::string::npos) symbols.push_back(line.substr(name + 1));
     }
     return symbols;
 }

@@ -30,9 +30,10 @@ struct ProcessResult {
 ProcessResult RunProcess(const std::vector<std::string>& argv, const std::string& cwd,
                          const std::vector<std::string>& env);
 
-// The names of the dynamic symbols a shared library defines (nm -D).
+// The names of the dynamic symbols a shared library defines (nm -D),
+// demangled on request.
 // Throws std::runtime_error when nm fails.
-std::vector<std::string> ExportedSymbols(const std::string& library);
+std::vector<std::string> ExportedSymbols(const std::string& library, bool demangled = false);
 
 // A program started in the background with this process's environment; its
 // standard output and error go to files.

@@ -26,8 +26,8 @@ void RequireNoOwnHelpOption(const AutoCli::NamespaceNode& node, const std::strin
     for (const auto& child : node.GetChildren()) {
         const std::string childPath = path + " " + child.first;
         if (AutoCli::Command* command = child.second->AsCommand()) {
-            const auto spec = command->GetInputSpec();
-            if (spec && (spec->FindByName("help") || spec->FindByShortName("h"))) {
+            const auto inputSpec = command->GetInputSpec();
+            if (inputSpec && (inputSpec->FindByName("help") || inputSpec->FindByShortName("h"))) {
                 std::fprintf(stderr, "'%s' declares its own --help; the fuzzer would execute it\n", childPath.c_str());
                 std::abort();
             }
