@@ -6,6 +6,7 @@
 #include <string>
 
 #include "hostctl/Export.h"
+#include "hostctl/network/nic/Pnic.h"
 #include "hostctl/network/vswitch/VirtualSwitch.h"
 
 namespace HostCtl {
@@ -18,6 +19,9 @@ public:
     static std::unique_ptr<VirtualSwitch> GetVirtualSwitchById(const std::string& name);
     // The port group of that name, or null.
     static std::unique_ptr<PortGroup> GetPortGroupByName(const std::string& name);
+    // The host's network-info object (its NICs). Never throws: the host is
+    // reached by the object's operations.
+    static std::unique_ptr<NetworkInfo> GetNetworkInfo();
 };
 
 }  // namespace Network

@@ -1,7 +1,9 @@
 // Host-wide networking information and settings.
 #pragma once
 
+#include <cstdint>
 #include <memory>
+#include <string>
 #include <vector>
 
 #include "hostctl/Export.h"
@@ -11,18 +13,32 @@
 namespace PldCtl {
 namespace Network {
 
-class HOSTCTL_EXPORT NetworkInfoImpl {
+class HOSTCTL_EXPORT NetworkInfoImpl : public HostCtl::Network::NetworkInfo {
 public:
     // Never throws: the host is reached by the operations.
     NetworkInfoImpl();
-    virtual ~NetworkInfoImpl();
+    ~NetworkInfoImpl() override;
 
     // Whether the kernel's IPv6 support is on.
     virtual bool IsPldIpv6Enabled();
     virtual void SetPldIpv6Enabled(bool enabled);
 
-    // The host's physical NICs, in the host's order.
-    virtual std::vector<std::unique_ptr<HostCtl::Network::Pnic>> GetPnics();
+    // The host's physical NICs, in the host's order, and one by name (null
+    // when the host has none of that name). One read of the one NIC.
+    std::vector<std::unique_ptr<HostCtl::Network::Pnic>> GetPnics() override;
+    std::unique_ptr<HostCtl::Network::Pnic> GetPnicByName(const std::string& name) override;
+
+    // The SR-IOV capable NICs, in the host's order, and one by name (null
+    // when the host has no SR-IOV NIC of that name).
+    virtual std::vector<std::unique_ptr<HostCtl::Network::Pnic>> GetSriovNics();
+    virtual std::unique_ptr<HostCtl::Network::Pnic> GetSriovNicByName(const std::string& name);
+    // The virtual functions of that SR-IOV NIC, in VF id order. Throws for a
+    // NIC that is not SR-IOV capable.
+    virtual std::vector<std::unique_ptr<HostCtl::Network::SriovNicVFInfo>> GetSriovNicVFInfo(const std::string& name);
+    // The counters of one VF. Throws for a NIC that is not SR-IOV capable and
+    // for a VF id the NIC does not have (the id is never narrowed).
+    virtual void GetSriovNicVFStats(HostCtl::Network::SriovNicVFStats& stats, const std::string& name,
+                                    std::int64_t vfId);
     // Every port group of every standard switch, switch by switch.
     virtual std::vector<std::unique_ptr<HostCtl::Network::PortGroup>> GetAllPortGroups();
 };

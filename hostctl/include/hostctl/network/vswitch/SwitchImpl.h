@@ -33,6 +33,9 @@ public:
     int GetNumUsedPorts() const override;
     int GetNumConfiguredPorts() const override;
     std::vector<std::string> GetUplinks() const override;
+    std::vector<std::unique_ptr<HostCtl::Network::VlanStats>> GetUplinkVlanStats(
+        const std::string& uplink) const override;
+    void SetUplinkVlanStatsEnabled(const std::string& uplink, bool enabled) override;
 
 protected:
     explicit PortsetImpl(std::shared_ptr<const Detail::VswitchRecord> record,
@@ -132,6 +135,8 @@ public:
 
     // In the host's order.
     virtual std::vector<std::unique_ptr<HostCtl::Network::VirtualSwitch>> GetVirtualSwitches();
+    // The same switches as port sets.
+    virtual std::vector<std::unique_ptr<HostCtl::Network::Portset>> GetAllSwitches();
     // Null when there is none.
     virtual std::unique_ptr<HostCtl::Network::VirtualSwitch> GetVirtualSwitchByName(const std::string& name);
     // Throws for a name in use or not fit for a switch, a port count outside

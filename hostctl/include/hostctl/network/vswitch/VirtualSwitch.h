@@ -15,6 +15,7 @@
 #include <vector>
 
 #include "hostctl/Export.h"
+#include "hostctl/network/nic/Pnic.h"
 #include "hostctl/network/vswitch/Policy.h"
 
 namespace HostCtl {
@@ -42,6 +43,13 @@ public:
     virtual int GetNumConfiguredPorts() const = 0;
     // The names of its uplinks, in order.
     virtual std::vector<std::string> GetUplinks() const = 0;
+    // The per-VLAN packet counters of one of its uplinks, one entry per VLAN
+    // seen, in the order they were seen; empty while counting is off. Throws
+    // for a name that is not an uplink of this switch.
+    virtual std::vector<std::unique_ptr<VlanStats>> GetUplinkVlanStats(const std::string& uplink) const = 0;
+    // Turns per-VLAN counting of one uplink on or off; turning it off drops
+    // the counters. Throws for a name that is not an uplink of this switch.
+    virtual void SetUplinkVlanStatsEnabled(const std::string& uplink, bool enabled) = 0;
 };
 
 // A standard virtual switch.

@@ -1,0 +1,41 @@
+#include "nic/NicLookup.h"
+
+namespace OrvixCli {
+namespace NetworkNamespace {
+
+namespace {
+
+std::string MissingMessage(MissingNic how, const std::string& name) {
+    switch (how) {
+        case MissingNic::NoPnic:
+            return "There is no pnic with name " + name;
+        case MissingNic::PnicNotFound:
+            return "Pnic with name " + name + " not found";
+        case MissingNic::NicNotFound:
+            return "NIC with name " + name + " not found";
+    }
+    return "There is no pnic with name " + name;
+}
+
+}  // namespace
+
+std::unique_ptr<HostCtl::Network::Pnic> FindPnic(HostCtl::Network::NetworkInfo& nics, const std::string& name,
+                                                 MissingNic how, CallSpec::Output& output) {
+    std::unique_ptr<HostCtl::Network::Pnic> pnic = nics.GetPnicByName(name);
+    if (!pnic) output.SetError(MissingMessage(how, name));
+    return pnic;
+}
+
+std::optional<std::vector<std::unique_ptr<HostCtl::Network::Pnic>>> SelectPnics(
+    HostCtl::Network::NetworkInfo& nics, const CallSpec::Input& input, const std::string& parameter,
+    MissingNic how, CallSpec::Output& output) {
+    if (!input.IsSet(parameter)) return nics.GetPnics();
+    std::unique_ptr<HostCtl::Network::Pnic> pnic = FindPnic(nics, input.GetString(parameter), how, output);
+    if (!pnic) return std::nullopt;
+    std::vector<std::unique_ptr<HostCtl::Network::Pnic>> one;
+    one.push_back(std::move(pnic));
+    return one;
+}
+
+}  // namespace NetworkNamespace
+}  // namespace OrvixCli
