@@ -101,6 +101,18 @@ TEST_F(HostsimTest, Faults) {
     EXPECT_TRUE(store->ListFaults().empty());
 }
 
+// What a user typed reaches the terminal with its control characters
+// escaped, in messages and in the fault table alike; the store keeps it exact.
+TEST_F(HostsimTest, ControlCharactersAreShownEscaped) {
+    EXPECT_EQ(Failure({"fault", "add", "\x1b]0;owned\x07", "--message", "m"}, 2),
+              "orvix-hostsim: fault operation '\\x1b]0;owned\\x07' must look like Class::Operation\n");
+    EXPECT_EQ(Run({"fault", "add", "A::B", "--key", "k\xc2\x9b", "--message", "\x1b[31mred"}).out, "1\n");
+    EXPECT_EQ(Run({"fault", "list"}).out,
+              "ID  OPERATION  KEY      REMAINING  MESSAGE\n"
+              "1   A::B       k\\u009b  always     \\x1b[31mred\n");
+    EXPECT_EQ(HostStore::Open(db)->ListFaults().at(0).message, "\x1b[31mred");
+}
+
 TEST_F(HostsimTest, UsageErrorsAndHelp) {
     EXPECT_EQ(Failure({}, 2), "orvix-hostsim: missing command (see orvix-hostsim --help)\n");
     EXPECT_EQ(Failure({"dumb"}, 2), "orvix-hostsim: unknown command 'dumb' (see orvix-hostsim --help)\n");

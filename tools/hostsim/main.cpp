@@ -11,6 +11,7 @@
 #include <vector>
 
 #include "hoststore/HostStore.h"
+#include "orvixtext/Utf8.h"
 
 namespace {
 
@@ -76,7 +77,7 @@ int Init(const Arguments& args) {
         } catch (const PldCtl::Store::UnusableFileError& e) {
             // Only a file found not to be a usable store is replaced; one
             // that cannot be read now (rights, a full disk) stays as it is.
-            std::cerr << "orvix-hostsim: " << e.what() << "; replacing it\n";
+            std::cerr << "orvix-hostsim: " << Orvix::Text::EscapeControls(e.what()) << "; replacing it\n";
             HostStore::Replace(path, profile, origin);
             return kOk;
         }
@@ -121,7 +122,12 @@ int FaultAdd(const Arguments& args) {
 }
 
 // Columns left-aligned and two blanks apart; the last one is not padded.
-void PrintTable(const std::vector<std::vector<std::string>>& rows) {
+// Cells hold what users typed (fault keys and messages) and are shown with
+// their control characters escaped.
+void PrintTable(std::vector<std::vector<std::string>> rows) {
+    for (auto& row : rows) {
+        for (std::string& cell : row) cell = Orvix::Text::EscapeControls(cell);
+    }
     std::vector<std::size_t> widths(rows.front().size(), 0);
     for (const auto& row : rows) {
         for (std::size_t i = 0; i < row.size(); ++i) widths[i] = std::max(widths[i], row[i].size());
@@ -358,7 +364,7 @@ int main(int argc, char** argv) {
     try {
         status = Run(std::vector<std::string>(argv + 1, argv + argc));
     } catch (const std::exception& e) {
-        std::cerr << "orvix-hostsim: " << e.what() << '\n';
+        std::cerr << "orvix-hostsim: " << Orvix::Text::EscapeControls(e.what()) << '\n';
         return StatusOf(e);
     }
     std::cout.flush();

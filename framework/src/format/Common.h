@@ -11,6 +11,7 @@
 #include <vector>
 
 #include "framework/Format.h"
+#include "orvixtext/Utf8.h"
 
 namespace AutoCli {
 namespace Formatting {
@@ -89,14 +90,13 @@ struct Table {
 // other result, which the caller renders in its own way.
 bool BuildTable(const MetaObject& result, const FormatHints& hints, const InlineStyle& style, Table& table);
 
-// Decodes the character at `pos` and returns the number of bytes it takes.
-// A byte that does not begin a well-formed UTF-8 sequence (truncated,
-// overlong, a surrogate, above U+10FFFF) decodes as U+FFFD and takes one byte.
-std::size_t DecodeUtf8(const std::string& text, std::size_t pos, char32_t& codePoint);
-// True when DecodeUtf8 stood in for a bad byte rather than read a real U+FFFD.
-inline bool IsBadByte(char32_t codePoint, std::size_t length) {
-    return codePoint == 0xFFFD && length == 1;
-}
+// The UTF-8 rules every formatter follows; AppendEscapedControls and
+// EscapeControls shape every human-facing text, the machine formats keep
+// text exact.
+using Orvix::Text::AppendEscapedControls;
+using Orvix::Text::DecodeUtf8;
+using Orvix::Text::EscapeControls;
+using Orvix::Text::IsBadByte;
 
 // Rewrites a text character by character. `replace` is called with each
 // character (a bad byte as U+FFFD, with badByte set) and returns the text to
@@ -116,15 +116,6 @@ std::string Recode(const std::string& text, Replace replace) {
     }
     return out;
 }
-
-// Appends `text` as a terminal may show it: each control character (C0,
-// DEL) and each byte that does not begin a well-formed UTF-8 sequence as
-// "\xNN", each C1 control character as "\u00NN", everything else as it
-// is. A control character in a name could otherwise move the cursor,
-// recolour the terminal or set its title. Every human-facing text goes
-// through here; the machine formats keep text exact.
-void AppendEscapedControls(std::string& out, const std::string& text);
-std::string EscapeControls(const std::string& text);
 
 // The number of characters of a text, for lining up columns.
 std::size_t DisplayWidth(const std::string& text);

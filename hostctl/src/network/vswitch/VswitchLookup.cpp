@@ -2,10 +2,10 @@
 
 #include <algorithm>
 
-#include "Text.h"
 #include "hostctl/Lib.h"
 #include "hostctl/network/vswitch/VswitchTables.h"
 #include "network/nic/NicRecords.h"
+#include "orvixtext/Utf8.h"
 
 namespace PldCtl {
 namespace Detail {
@@ -56,7 +56,7 @@ void CheckSwitchName(const std::string& name) {
 // Port group names may hold blanks ("VM Network") and any printable
 // character, counted as characters, not bytes.
 void CheckPortGroupName(const std::string& name) {
-    const std::optional<std::size_t> length = PrintableLength(name);
+    const std::optional<std::size_t> length = Orvix::Text::PrintableLength(name);
     const bool fits =
         length && *length >= 1 && *length <= kMaxPortGroupNameLength && name.front() != ' ' && name.back() != ' ';
     if (!fits) {
