@@ -12,6 +12,9 @@
 #include "framework/AutoCli.h"
 #include "ip/IpGet.h"
 #include "ip/IpSet.h"
+#include "nic/NicStatsGet.h"
+#include "nic/NicVlanStatsGet.h"
+#include "nic/NicVlanStatsSet.h"
 #include "vswitch/VirtualSwitchPortGroupAdd.h"
 #include "vswitch/VirtualSwitchPortGroupList.h"
 #include "vswitch/VirtualSwitchPortGroupPolicyFailoverGet.h"
@@ -196,14 +199,14 @@ extern "C" __attribute__((visibility("default"))) void AutoCli_RegisterNamespace
     auto nicRing = Attach(nic, "ring", "Commands to access NIC RX/TX ring buffer parameters");
 
     // network nic stats
-    // get: NicStatsGet
+    nicStats->RegisterNamespaceNode(NicStatsGet::New(), "get");
 
     // network nic vlan
     auto nicVlanStats = Attach(nicVlan, "stats", "Commands to access VLAN statistics for a NIC");
 
     // network nic vlan stats
-    // get: NicVlanStatsGet
-    // set: NicVlanStatsSet
+    nicVlanStats->RegisterNamespaceNode(NicVlanStatsGet::New(), "get");
+    nicVlanStats->RegisterNamespaceNode(NicVlanStatsSet::New(), "set");
 
     // network nic coalesce
     // get: NicCoalesceGet

@@ -39,5 +39,16 @@ std::optional<std::vector<std::unique_ptr<HostCtl::Network::Pnic>>> SelectPnics(
     return one;
 }
 
+HostCtl::Network::Portset* FindUplinkSwitch(const std::vector<std::unique_ptr<HostCtl::Network::Portset>>& switches,
+                                            const std::string& nic, CallSpec::Output& output) {
+    for (const auto& vswitch : switches) {
+        for (const std::string& uplink : vswitch->GetUplinks()) {
+            if (uplink == nic) return vswitch.get();
+        }
+    }
+    output.SetError(nic + " is not a valid NIC connected to any virtual switch.");
+    return nullptr;
+}
+
 }  // namespace NetworkNamespace
 }  // namespace OrvixCli

@@ -13,6 +13,7 @@
 #include "common/CommandSupport.h"
 #include "framework/CallSpec.h"
 #include "hostctl/network/nic/Pnic.h"
+#include "hostctl/network/vswitch/VirtualSwitch.h"
 
 namespace OrvixCli {
 namespace NetworkNamespace {
@@ -55,6 +56,12 @@ std::optional<std::vector<std::unique_ptr<HostCtl::Network::Pnic>>> SelectPnics(
                                                                                 const std::string& parameter,
                                                                                 MissingNic how,
                                                                                 CallSpec::Output& output);
+
+// The first standard switch, in `switches`' order, that has the NIC of
+// that name (exactly, case and all) among its uplinks; null after reporting
+// "NAME is not a valid NIC connected to any virtual switch." when none has.
+HostCtl::Network::Portset* FindUplinkSwitch(const std::vector<std::unique_ptr<HostCtl::Network::Portset>>& switches,
+                                            const std::string& nic, CallSpec::Output& output);
 
 // Runs `read` against one NIC of a listing: false when the NIC cannot
 // answer (a HostCtlException), so that the row shows its fallback values and
