@@ -76,6 +76,20 @@ TEST_F(Pnics, SnapshotsKeepWhatTheyReadAndNamedObjectsReadOnFirstUse) {
     EXPECT_EQ(StoredNic("hwnic1")["autoNegotiation"], false);
 }
 
+TEST_F(Pnics, AChangeFromAnOlderSnapshotKeepsOtherChanges) {
+    auto first = Nic("hwnic2");
+    auto second = Nic("hwnic2");
+    first->SetAdminUp(false);
+    OffloadSettings offloads;
+    offloads.mask = OffloadSettings::MASK_TSO;
+    second->SetOffloadSettings(offloads);
+    // The second object's write carried only its own edit.
+    const Json stored = StoredNic("hwnic2");
+    EXPECT_EQ(stored["adminUp"], false);
+    EXPECT_EQ(stored["offloads"]["tso"], false);
+    EXPECT_FALSE(second->IsAdminUp());
+}
+
 TEST_F(Pnics, NamesTheHostDoesNotHave) {
     EXPECT_EQ(NetworkInfoImpl().GetPnicByName("hwnic9"), nullptr);
     EXPECT_FALSE(PnicImpl::IsValidPnic("hwnic9"));
