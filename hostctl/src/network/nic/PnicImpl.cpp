@@ -221,6 +221,13 @@ const NicRecord& Stored(const std::string& name, std::shared_ptr<const NicRecord
     return *record;
 }
 
+// What a reading operation does first: give an injected fault its chance,
+// then take the snapshot (reading the stored NIC if it has none yet).
+const NicRecord& Enter(const char* operation, const std::string& name, std::shared_ptr<const NicRecord>& record) {
+    Detail::EnterOperation(operation, name);
+    return Stored(name, record);
+}
+
 // One transaction that applies `edit` to the stored NIC and makes what it
 // wrote the snapshot. `edit` throws to refuse the change; nothing is
 // written then.
@@ -317,7 +324,7 @@ std::uint32_t PnicImpl::GetMtu() const {
 }
 
 void PnicImpl::GetPnicInfo(PnicInfo& info) {
-    const NicRecord& nic = (Detail::EnterOperation("PnicImpl::GetPnicInfo", name_), Stored(name_, record_));
+    const NicRecord& nic = Enter("PnicImpl::GetPnicInfo", name_, record_);
     info = PnicInfo();
     for (std::int64_t port : nic.supportedPorts) info.supportedPorts.push_back(static_cast<int>(port));
     info.supportsAutoNegotiation = nic.supportsAutoNegotiation;
@@ -373,8 +380,7 @@ void PnicImpl::SetPnicInfo(const PnicInfo& info) {
 }
 
 void PnicImpl::GetPauseParams(PauseParams& params) {
-    const Detail::PauseRecord& pause =
-        (Detail::EnterOperation("PnicImpl::GetPauseParams", name_), Stored(name_, record_)).pause;
+    const Detail::PauseRecord& pause = Enter("PnicImpl::GetPauseParams", name_, record_).pause;
     params =
         PauseParams{pause.supported, pause.autoNegotiate, pause.rx, pause.tx, pause.rxResolution, pause.txResolution};
 }
@@ -389,9 +395,7 @@ void PnicImpl::SetPauseParams(const PauseParams& params) {
 }
 
 void PnicImpl::GetCoalesceParams(CoalesceParams& params) {
-    const auto& coalesce =
-        Supported((Detail::EnterOperation("PnicImpl::GetCoalesceParams", name_), Stored(name_, record_)).coalesce,
-                  name_, kCoalesce);
+    const auto& coalesce = Supported(Enter("PnicImpl::GetCoalesceParams", name_, record_).coalesce, name_, kCoalesce);
     params = CoalesceParams{coalesce.adaptiveRx,  coalesce.adaptiveTx, coalesce.sampleInterval, coalesce.rxUsecs,
                             coalesce.rxMaxFrames, coalesce.txUsecs,    coalesce.txMaxFrames};
 }
@@ -416,8 +420,7 @@ void PnicImpl::SetCoalesceParams(const CoalesceParams& params) {
 }
 
 void PnicImpl::GetRingParams(RingParams& preset, RingParams& current) {
-    const auto& rings = Supported(
-        (Detail::EnterOperation("PnicImpl::GetRingParams", name_), Stored(name_, record_)).rings, name_, kRings);
+    const auto& rings = Supported(Enter("PnicImpl::GetRingParams", name_, record_).rings, name_, kRings);
     auto fill = [](RingParams& out, const Detail::RingSizesRecord& sizes) {
         out = RingParams();
         out.mask = RingParams::MASK_RX | RingParams::MASK_RX_MINI | RingParams::MASK_RX_JUMBO | RingParams::MASK_TX;
@@ -455,9 +458,7 @@ void PnicImpl::SetRingParams(const RingParams& params) {
 }
 
 void PnicImpl::GetOffloadSettings(OffloadSettings& settings) {
-    const auto& offloads =
-        Supported((Detail::EnterOperation("PnicImpl::GetOffloadSettings", name_), Stored(name_, record_)).offloads,
-                  name_, kOffloads);
+    const auto& offloads = Supported(Enter("PnicImpl::GetOffloadSettings", name_, record_).offloads, name_, kOffloads);
     settings = OffloadSettings();
     settings.mask = OffloadSettings::MASK_RX_CHECKSUM | OffloadSettings::MASK_TX_CHECKSUM |
                     OffloadSettings::MASK_SCATTER_GATHER | OffloadSettings::MASK_TSO;
@@ -478,8 +479,7 @@ void PnicImpl::SetOffloadSettings(const OffloadSettings& settings) {
 }
 
 void PnicImpl::GetSoftwareSimulation(SoftwareSimulation& simulation) {
-    const auto& stored =
-        (Detail::EnterOperation("PnicImpl::GetSoftwareSimulation", name_), Stored(name_, record_)).softwareSimulation;
+    const auto& stored = Enter("PnicImpl::GetSoftwareSimulation", name_, record_).softwareSimulation;
     simulation = SoftwareSimulation();
     for (std::size_t feature = 0; feature < SoftwareSimulation::FEATURE_COUNT; ++feature) {
         simulation.mask |= SoftwareSimulation::MaskOf(static_cast<SoftwareSimulation::Feature>(feature));
@@ -498,13 +498,12 @@ void PnicImpl::SetSoftwareSimulation(const SoftwareSimulation& simulation) {
 }
 
 void PnicImpl::GetDriverInfo(DriverInfo& info) {
-    const NicRecord& nic = (Detail::EnterOperation("PnicImpl::GetDriverInfo", name_), Stored(name_, record_));
+    const NicRecord& nic = Enter("PnicImpl::GetDriverInfo", name_, record_);
     info = DriverInfo{nic.driver, nic.driverVersion, nic.firmwareVersion, nic.pciDevice.value_or("")};
 }
 
 void PnicImpl::GetPnicStats(PnicStats& stats) {
-    const Detail::NicStatsRecord& s =
-        (Detail::EnterOperation("PnicImpl::GetPnicStats", name_), Stored(name_, record_)).stats;
+    const Detail::NicStatsRecord& s = Enter("PnicImpl::GetPnicStats", name_, record_).stats;
     stats = PnicStats{s.rxPackets,    s.txPackets,         s.rxBytes,       s.txBytes,         s.rxDropped,
                       s.txDropped,    s.rxMulticast,       s.rxBroadcast,   s.txMulticast,     s.txBroadcast,
                       s.rxErrors,     s.rxLengthErrors,    s.rxOverErrors,  s.rxCrcErrors,     s.rxFrameErrors,
@@ -513,13 +512,12 @@ void PnicImpl::GetPnicStats(PnicStats& stats) {
 }
 
 void PnicImpl::GetRegisters(std::vector<std::uint32_t>& registers) {
-    registers = Supported((Detail::EnterOperation("PnicImpl::GetRegisters", name_), Stored(name_, record_)).registers,
-                          name_, kRegisters);
+    registers = Supported(Enter("PnicImpl::GetRegisters", name_, record_).registers, name_, kRegisters);
 }
 
 void PnicImpl::GetEeprom(std::vector<std::uint8_t>& bytes, std::int64_t length, std::int64_t offset) {
-    const std::vector<std::uint8_t> image = EepromBytes(Supported(
-        (Detail::EnterOperation("PnicImpl::GetEeprom", name_), Stored(name_, record_)).eeprom, name_, kEeprom));
+    const std::vector<std::uint8_t> image =
+        EepromBytes(Supported(Enter("PnicImpl::GetEeprom", name_, record_).eeprom, name_, kEeprom));
     const std::int64_t size = static_cast<std::int64_t>(image.size());
     CheckRange(name_, "EEPROM offset", offset, 0, size - 1);
     CheckRange(name_, "EEPROM length", length, 0, size - offset);
@@ -560,8 +558,7 @@ void PnicImpl::RestartNegotiation() {
 }
 
 void PnicImpl::RunSelfTest(SelfTestResult& result, bool online) {
-    const auto& selfTest = Supported(
-        (Detail::EnterOperation("PnicImpl::RunSelfTest", name_), Stored(name_, record_)).selfTest, name_, kSelfTest);
+    const auto& selfTest = Supported(Enter("PnicImpl::RunSelfTest", name_, record_).selfTest, name_, kSelfTest);
     result.passed = selfTest.passed;
     result.info = online ? selfTest.online : selfTest.offline;
 }
