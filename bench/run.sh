@@ -3,7 +3,7 @@
 # that starts, dlopens one shared library and calls one function), measured in
 # the same run and interleaved with it. Prints medians and their ratios to the
 # baseline, on the default host and on a large one (about 1000 standard
-# switches, 4096 ports, 2000 port groups, 256 interfaces, 10000 routes; made by
+# switches, 4096 ports, 2000 port groups, 64 NICs, 256 interfaces, 10000 routes; made by
 # orvix-bench-make-profile). Run it through `./dev bench` so that everything is
 # built.
 #
@@ -34,13 +34,17 @@ echo "Default host ($runs runs each, $(nproc) cores):"
     "network vswitch standard portgroup list" "$cli network vswitch standard portgroup list" \
     "network vswitch standard add" "$cli network vswitch standard add $scratch" \
     "network vswitch standard remove" "$cli network vswitch standard remove $scratch" \
-    "... portgroup policy failover get" "$cli network vswitch standard portgroup policy failover get -p Storage"
+    "... portgroup policy failover get" "$cli network vswitch standard portgroup policy failover get -p Storage" \
+    "network nic list" "$cli network nic list" \
+    "network nic get" "$cli network nic get -n hwnic0" \
+    "network nic stats get" "$cli network nic stats get -n hwnic0" \
+    "network nic up" "$cli network nic up -n hwnic0"
 
 export ORVIX_HOST_DB=$work/large.db
 "$bin/orvix-bench-make-profile" >"$work/large.json"
 "$bin/orvix-hostsim" init --profile "$work/large.json" >/dev/null
 echo
-echo "Large host: 1000 switches, 4096 ports, 2000 port groups, 256 interfaces, 10000 routes ($runs runs each):"
+echo "Large host: 1000 switches, 4096 ports, 2000 port groups, 64 NICs, 256 interfaces, 10000 routes ($runs runs each):"
 "$bin/orvix-bench-timer" "$runs" \
     "baseline (dlopen + one call)" "$bin/orvix-bench-baseline" \
     "network ip get" "$cli network ip get" \
@@ -48,4 +52,8 @@ echo "Large host: 1000 switches, 4096 ports, 2000 port groups, 256 interfaces, 1
     "network vswitch standard portgroup list" "$cli network vswitch standard portgroup list" \
     "network vswitch standard add" "$cli network vswitch standard add $scratch" \
     "network vswitch standard remove" "$cli network vswitch standard remove $scratch" \
-    "... portgroup policy failover get" "$cli network vswitch standard portgroup policy failover get -p vSwitch500-pg1"
+    "... portgroup policy failover get" "$cli network vswitch standard portgroup policy failover get -p vSwitch500-pg1" \
+    "network nic list" "$cli network nic list" \
+    "network nic get" "$cli network nic get -n hwnic63" \
+    "network nic stats get" "$cli network nic stats get -n hwnic63" \
+    "network nic up" "$cli network nic up -n hwnic63"
