@@ -12,6 +12,7 @@
 
 #include "common/CommandSupport.h"
 #include "framework/CallSpec.h"
+#include "hostctl/network/NetworkInfoImpl.h"
 #include "hostctl/network/nic/Pnic.h"
 
 namespace OrvixCli {
@@ -34,6 +35,11 @@ enum class MissingNic {
 std::unique_ptr<HostCtl::Network::Pnic> FindPnic(HostCtl::Network::NetworkInfo& nics, const std::string& name,
                                                  MissingNic how, CallSpec::Output& output);
 
+// Whether the host has an SR-IOV NIC of that name; reports "There is no
+// SRIOV Nic with name X" when it has none. Throws HostCtlException as the
+// library does.
+bool FindSriovNic(PldCtl::Network::NetworkInfoImpl& nics, const std::string& name, CallSpec::Output& output);
+
 // Runs `body` with the NIC named by `parameter`, found through `nics`; the
 // library's errors, from the lookup or from `body`, are reported as they are.
 template <typename Body>
@@ -50,9 +56,11 @@ void OnPnic(HostCtl::Network::NetworkInfo& nics, const boost::shared_ptr<CallSpe
 // The NICs a listing covers: the one named by `parameter` when it is given,
 // else every NIC of the host in its order. Nothing (after reporting it) when
 // the named NIC does not exist. Throws HostCtlException as the library does.
-std::optional<std::vector<std::unique_ptr<HostCtl::Network::Pnic>>> SelectPnics(
-    HostCtl::Network::NetworkInfo& nics, const CallSpec::Input& input, const std::string& parameter,
-    MissingNic how, CallSpec::Output& output);
+std::optional<std::vector<std::unique_ptr<HostCtl::Network::Pnic>>> SelectPnics(HostCtl::Network::NetworkInfo& nics,
+                                                                                const CallSpec::Input& input,
+                                                                                const std::string& parameter,
+                                                                                MissingNic how,
+                                                                                CallSpec::Output& output);
 
 // Runs `read` against one NIC of a listing: false when the NIC cannot
 // answer (a HostCtlException), so that the row shows its fallback values and
