@@ -32,11 +32,9 @@ bool FindSriovNic(PldCtl::Network::NetworkInfoImpl& nics, const std::string& nam
     return false;
 }
 
-std::optional<std::vector<std::unique_ptr<HostCtl::Network::Pnic>>> SelectPnics(HostCtl::Network::NetworkInfo& nics,
-                                                                                const CallSpec::Input& input,
-                                                                                const std::string& parameter,
-                                                                                MissingNic how,
-                                                                                CallSpec::Output& output) {
+std::optional<std::vector<std::unique_ptr<HostCtl::Network::Pnic>>> SelectPnics(
+    HostCtl::Network::NetworkInfo& nics, const CallSpec::Input& input, const std::string& parameter,
+    MissingNic how, CallSpec::Output& output) {
     if (!input.IsSet(parameter)) return nics.GetPnics();
     std::unique_ptr<HostCtl::Network::Pnic> pnic = FindPnic(nics, input.GetString(parameter), how, output);
     if (!pnic) return std::nullopt;

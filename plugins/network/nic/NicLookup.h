@@ -56,11 +56,9 @@ void OnPnic(HostCtl::Network::NetworkInfo& nics, const boost::shared_ptr<CallSpe
 // The NICs a listing covers: the one named by `parameter` when it is given,
 // else every NIC of the host in its order. Nothing (after reporting it) when
 // the named NIC does not exist. Throws HostCtlException as the library does.
-std::optional<std::vector<std::unique_ptr<HostCtl::Network::Pnic>>> SelectPnics(HostCtl::Network::NetworkInfo& nics,
-                                                                                const CallSpec::Input& input,
-                                                                                const std::string& parameter,
-                                                                                MissingNic how,
-                                                                                CallSpec::Output& output);
+std::optional<std::vector<std::unique_ptr<HostCtl::Network::Pnic>>> SelectPnics(
+    HostCtl::Network::NetworkInfo& nics, const CallSpec::Input& input, const std::string& parameter,
+    MissingNic how, CallSpec::Output& output);
 
 // Runs `read` against one NIC of a listing: false when the NIC cannot
 // answer (a HostCtlException), so that the row shows its fallback values and
