@@ -12,9 +12,22 @@
 #include "framework/AutoCli.h"
 #include "ip/IpGet.h"
 #include "ip/IpSet.h"
+#include "nic/NicDown.h"
+#include "nic/NicEepromChange.h"
+#include "nic/NicEepromDump.h"
+#include "nic/NicGet.h"
+#include "nic/NicList.h"
+#include "nic/NicNegotiationRestart.h"
+#include "nic/NicRegisterDump.h"
+#include "nic/NicSelfTestRun.h"
+#include "nic/NicSet.h"
 #include "nic/NicStatsGet.h"
+#include "nic/NicUp.h"
 #include "nic/NicVlanStatsGet.h"
 #include "nic/NicVlanStatsSet.h"
+#include "nic/SriovNicList.h"
+#include "nic/VfList.h"
+#include "nic/VfStats.h"
 #include "vswitch/VirtualSwitchPortGroupAdd.h"
 #include "vswitch/VirtualSwitchPortGroupList.h"
 #include "vswitch/VirtualSwitchPortGroupPolicyFailoverGet.h"
@@ -179,11 +192,11 @@ extern "C" __attribute__((visibility("default"))) void AutoCli_RegisterNamespace
     // set: IpNetstackInstanceSet
 
     // network nic
-    // list: NicList
-    // up: NicUp
-    // get: NicGet
-    // set: NicSet
-    // down: NicDown
+    nic->RegisterNamespaceNode(NicList::New(), "list");
+    nic->RegisterNamespaceNode(NicUp::New(), "up");
+    nic->RegisterNamespaceNode(NicGet::New(), "get");
+    nic->RegisterNamespaceNode(NicSet::New(), "set");
+    nic->RegisterNamespaceNode(NicDown::New(), "down");
     auto nicStats = Attach(nic, "stats", "Get packet statistics for a NIC");
     auto nicVlan = Attach(nic, "vlan", "Get VLAN information for a NIC");
     auto nicCoalesce = Attach(nic, "coalesce", "Commands to access coalesce paramaters for a NIC");
@@ -229,17 +242,17 @@ extern "C" __attribute__((visibility("default"))) void AutoCli_RegisterNamespace
     // set: NicPauseParamsSet
 
     // network nic register
-    // dump: NicRegisterDump
+    nicRegister->RegisterNamespaceNode(NicRegisterDump::New(), "dump");
 
     // network nic eeprom
-    // dump: NicEepromDump
-    // change: NicEepromChange
+    nicEeprom->RegisterNamespaceNode(NicEepromDump::New(), "dump");
+    nicEeprom->RegisterNamespaceNode(NicEepromChange::New(), "change");
 
     // network nic negotiate
-    // restart: NicNegotiationRestart
+    nicNegotiate->RegisterNamespaceNode(NicNegotiationRestart::New(), "restart");
 
     // network nic selftest
-    // run: NicSelfTestRun
+    nicSelftest->RegisterNamespaceNode(NicSelfTestRun::New(), "run");
 
     // network nic software
     // list: NicSoftwareList
@@ -257,12 +270,12 @@ extern "C" __attribute__((visibility("default"))) void AutoCli_RegisterNamespace
     // set: NicRingCurrentSet
 
     // network sriovnic
-    // list: SriovNicList
+    sriovnic->RegisterNamespaceNode(SriovNicList::New(), "list");
     auto sriovnicVf = Attach(sriovnic, "vf", "Operations related to VFs of a SRIOV capable pNIC");
 
     // network sriovnic vf
-    // list: VfList
-    // stats: VfStats
+    sriovnicVf->RegisterNamespaceNode(VfList::New(), "list");
+    sriovnicVf->RegisterNamespaceNode(VfStats::New(), "stats");
 
     // network vswitch
     auto vswitchStandard =

@@ -26,6 +26,12 @@ std::unique_ptr<HostCtl::Network::Pnic> FindPnic(HostCtl::Network::NetworkInfo& 
     return pnic;
 }
 
+bool FindSriovNic(PldCtl::Network::NetworkInfoImpl& nics, const std::string& name, CallSpec::Output& output) {
+    if (nics.GetSriovNicByName(name)) return true;
+    output.SetError("There is no SRIOV Nic with name " + name);
+    return false;
+}
+
 std::optional<std::vector<std::unique_ptr<HostCtl::Network::Pnic>>> SelectPnics(HostCtl::Network::NetworkInfo& nics,
                                                                                 const CallSpec::Input& input,
                                                                                 const std::string& parameter,

@@ -12,6 +12,7 @@
 
 #include "common/CommandSupport.h"
 #include "framework/CallSpec.h"
+#include "hostctl/network/NetworkInfoImpl.h"
 #include "hostctl/network/nic/Pnic.h"
 #include "hostctl/network/vswitch/VirtualSwitch.h"
 
@@ -34,6 +35,11 @@ enum class MissingNic {
 // none. Throws HostCtlException as the library does.
 std::unique_ptr<HostCtl::Network::Pnic> FindPnic(HostCtl::Network::NetworkInfo& nics, const std::string& name,
                                                  MissingNic how, CallSpec::Output& output);
+
+// Whether the host has an SR-IOV NIC of that name; reports "There is no
+// SRIOV Nic with name X" when it has none. Throws HostCtlException as the
+// library does.
+bool FindSriovNic(PldCtl::Network::NetworkInfoImpl& nics, const std::string& name, CallSpec::Output& output);
 
 // Runs `body` with the NIC named by `parameter`, found through `nics`; the
 // library's errors, from the lookup or from `body`, are reported as they are.
