@@ -67,6 +67,19 @@ TEST_F(Diagnostics, EepromReadsARangeOrToTheEnd) {
               "Invalid EEPROM length value -1 for NIC hwnic0: must be between 0 and 64");
 }
 
+// An EEPROM of no bytes reads as nothing and takes no 32-bit word.
+TEST_F(Diagnostics, AnEmptyEepromReadsAsNothing) {
+    ASSERT_FALSE(Eeprom("hwnic0").empty());  // creates the host
+    RawSql(R"(UPDATE object SET doc = json_set(doc, '$.eeprom', '') WHERE section = 'nics' AND key = 'hwnic0')");
+    EXPECT_TRUE(Eeprom("hwnic0").empty());
+    std::vector<std::uint8_t> bytes;
+    EXPECT_EQ(MessageOf([&] { PnicImpl("hwnic0").GetEeprom(bytes, 1, 0); }),
+              "Invalid EEPROM length value 1 for NIC hwnic0: must be between 0 and 0");
+    EXPECT_EQ(MessageOf([&] { PnicImpl("hwnic0").SetEepromValue(kMagic, 0, 1); }),
+              "The EEPROM of NIC hwnic0 has 0 bytes, too few for a 32-bit value");
+    EXPECT_EQ(StoredEeprom("hwnic0"), "");
+}
+
 TEST_F(Diagnostics, EepromValueIsStoredLowestByteFirst) {
     PnicImpl nic("hwnic0");
     nic.SetEepromValue(kMagic, 60, 0x11223344);
@@ -83,9 +96,9 @@ TEST_F(Diagnostics, EepromValueIsStoredLowestByteFirst) {
     EXPECT_EQ(MessageOf([&] { nic.SetEepromValue(kMagic, -4, 0); }),
               "Invalid EEPROM offset value -4 for NIC hwnic0: must be between 0 and 60");
     EXPECT_EQ(MessageOf([&] { nic.SetEepromValue(kMagic, 0, 4294967296); }),
-              "Invalid EEPROM value value 4294967296 for NIC hwnic0: must be between 0 and 4294967295");
+              "Invalid EEPROM word value 4294967296 for NIC hwnic0: must be between 0 and 4294967295");
     EXPECT_EQ(MessageOf([&] { nic.SetEepromValue(kMagic, 0, -1); }),
-              "Invalid EEPROM value value -1 for NIC hwnic0: must be between 0 and 4294967295");
+              "Invalid EEPROM word value -1 for NIC hwnic0: must be between 0 and 4294967295");
     EXPECT_EQ(StoredEeprom("hwnic0"), before);
 }
 

@@ -519,7 +519,8 @@ void PnicImpl::GetEeprom(std::vector<std::uint8_t>& bytes, std::int64_t length, 
     const std::vector<std::uint8_t> image =
         EepromBytes(Supported(Enter("PnicImpl::GetEeprom", name_, record_).eeprom, name_, kEeprom));
     const std::int64_t size = static_cast<std::int64_t>(image.size());
-    CheckRange(name_, "EEPROM offset", offset, 0, size - 1);
+    // An empty EEPROM reads as nothing from offset 0.
+    CheckRange(name_, "EEPROM offset", offset, 0, std::max<std::int64_t>(size - 1, 0));
     CheckRange(name_, "EEPROM length", length, 0, size - offset);
     const std::int64_t end = length == 0 ? size : offset + length;
     bytes.assign(image.begin() + offset, image.begin() + end);
@@ -529,8 +530,12 @@ void PnicImpl::SetEepromValue(std::int64_t magic, std::int64_t offset, std::int6
     ChangeNic(Detail::EnterOperation("PnicImpl::SetEepromValue", name_), name_, record_, [&](NicRecord& nic) {
         std::vector<std::uint8_t> image = EepromBytes(Supported(nic.eeprom, name_, kEeprom));
         CheckMagic(nic, magic);
+        if (image.size() < 4) {
+            throw HostCtlException("The EEPROM of NIC " + name_ + " has " + std::to_string(image.size()) +
+                                   " bytes, too few for a 32-bit value");
+        }
         CheckRange(name_, "EEPROM offset", offset, 0, static_cast<std::int64_t>(image.size()) - 4);
-        CheckRange(name_, "EEPROM value", value, 0, kUint32Max);
+        CheckRange(name_, "EEPROM word", value, 0, kUint32Max);
         for (int i = 0; i < 4; ++i) {
             image[static_cast<std::size_t>(offset + i)] = static_cast<std::uint8_t>((value >> (8 * i)) & 0xff);
         }

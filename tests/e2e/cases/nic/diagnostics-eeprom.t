@@ -38,7 +38,7 @@ $ orvixcli network nic eeprom change -n hwnic0 -m 1 --offset 4 --value 1
 ## Values, offsets and keys that do not fit reach the library whole and are
 ## refused there.
 $ orvixcli network nic eeprom change -n hwnic0 -m 305419896 --offset 4 --value 4294967296
-! Invalid EEPROM value value 4294967296 for NIC hwnic0: must be between 0 and 4294967295
+! Invalid EEPROM word value 4294967296 for NIC hwnic0: must be between 0 and 4294967295
 [1]
 
 $ orvixcli network nic eeprom change -n hwnic0 -m 305419896 --offset 46 --value 1
