@@ -107,12 +107,7 @@ void NetworkInfoImpl::GetSriovNicVFStats(HostCtl::Network::SriovNicVFStats& stat
     if (vf == nic.sriovVfs->end()) {
         throw HostCtl::Lib::HostCtlException("NIC " + name + " has no VF with ID " + std::to_string(vfId));
     }
-    const Detail::VfStatsRecord& s = vf->stats;
-    stats = HostCtl::Network::SriovNicVFStats{
-        s.rxUnicastPackets, s.rxUnicastBytes,     s.rxMulticastPackets, s.rxMulticastBytes, s.rxBroadcastPackets,
-        s.rxBroadcastBytes, s.rxOutOfBufferDrops, s.rxErrorDrops,       s.rxLroPackets,     s.rxLroBytes,
-        s.txUnicastPackets, s.txUnicastBytes,     s.txMulticastPackets, s.txMulticastBytes, s.txBroadcastPackets,
-        s.txBroadcastBytes, s.txErrors,           s.txDiscards,         s.txTsoPackets,     s.txTsoBytes};
+    stats = vf->stats;
 }
 
 std::vector<std::unique_ptr<HostCtl::Network::PortGroup>> NetworkInfoImpl::GetAllPortGroups() {

@@ -10,6 +10,7 @@
 #include <string>
 #include <vector>
 
+#include "hostctl/network/nic/Pnic.h"
 #include "hoststore/CollectionNames.h"
 #include "network/StoredRecord.h"
 
@@ -79,31 +80,8 @@ struct SoftwareSimulationRecord {
     bool geneveOffload = false;
 };
 
-struct NicStatsRecord {
-    std::uint64_t rxPackets = 0;
-    std::uint64_t txPackets = 0;
-    std::uint64_t rxBytes = 0;
-    std::uint64_t txBytes = 0;
-    std::uint64_t rxDropped = 0;
-    std::uint64_t txDropped = 0;
-    std::uint64_t rxMulticast = 0;
-    std::uint64_t rxBroadcast = 0;
-    std::uint64_t txMulticast = 0;
-    std::uint64_t txBroadcast = 0;
-    std::uint64_t rxErrors = 0;
-    std::uint64_t rxLengthErrors = 0;
-    std::uint64_t rxOverErrors = 0;
-    std::uint64_t rxCrcErrors = 0;
-    std::uint64_t rxFrameErrors = 0;
-    std::uint64_t rxFifoErrors = 0;
-    std::uint64_t rxMissedErrors = 0;
-    std::uint64_t txErrors = 0;
-    std::uint64_t txAbortedErrors = 0;
-    std::uint64_t txCarrierErrors = 0;
-    std::uint64_t txFifoErrors = 0;
-    std::uint64_t txHeartbeatErrors = 0;
-    std::uint64_t txWindowErrors = 0;
-};
+// The counters are stored as the library hands them out.
+using NicStatsRecord = HostCtl::Network::PnicStats;
 
 struct SelfTestRecord {
     bool passed = false;
@@ -111,28 +89,7 @@ struct SelfTestRecord {
     std::vector<std::string> offline;  // result lines of an offline test
 };
 
-struct VfStatsRecord {
-    std::uint64_t rxUnicastPackets = 0;
-    std::uint64_t rxUnicastBytes = 0;
-    std::uint64_t rxMulticastPackets = 0;
-    std::uint64_t rxMulticastBytes = 0;
-    std::uint64_t rxBroadcastPackets = 0;
-    std::uint64_t rxBroadcastBytes = 0;
-    std::uint64_t rxOutOfBufferDrops = 0;
-    std::uint64_t rxErrorDrops = 0;
-    std::uint64_t rxLroPackets = 0;
-    std::uint64_t rxLroBytes = 0;
-    std::uint64_t txUnicastPackets = 0;
-    std::uint64_t txUnicastBytes = 0;
-    std::uint64_t txMulticastPackets = 0;
-    std::uint64_t txMulticastBytes = 0;
-    std::uint64_t txBroadcastPackets = 0;
-    std::uint64_t txBroadcastBytes = 0;
-    std::uint64_t txErrors = 0;
-    std::uint64_t txDiscards = 0;
-    std::uint64_t txTsoPackets = 0;
-    std::uint64_t txTsoBytes = 0;
-};
+using VfStatsRecord = HostCtl::Network::SriovNicVFStats;
 
 // One virtual function of an SR-IOV NIC.
 struct VfRecord {

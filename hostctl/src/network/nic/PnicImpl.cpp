@@ -503,12 +503,7 @@ void PnicImpl::GetDriverInfo(DriverInfo& info) {
 }
 
 void PnicImpl::GetPnicStats(PnicStats& stats) {
-    const Detail::NicStatsRecord& s = Enter("PnicImpl::GetPnicStats", name_, record_).stats;
-    stats = PnicStats{s.rxPackets,    s.txPackets,         s.rxBytes,       s.txBytes,         s.rxDropped,
-                      s.txDropped,    s.rxMulticast,       s.rxBroadcast,   s.txMulticast,     s.txBroadcast,
-                      s.rxErrors,     s.rxLengthErrors,    s.rxOverErrors,  s.rxCrcErrors,     s.rxFrameErrors,
-                      s.rxFifoErrors, s.rxMissedErrors,    s.txErrors,      s.txAbortedErrors, s.txCarrierErrors,
-                      s.txFifoErrors, s.txHeartbeatErrors, s.txWindowErrors};
+    stats = Enter("PnicImpl::GetPnicStats", name_, record_).stats;
 }
 
 void PnicImpl::GetRegisters(std::vector<std::uint32_t>& registers) {
