@@ -12,6 +12,21 @@
 #include "framework/AutoCli.h"
 #include "ip/IpGet.h"
 #include "ip/IpSet.h"
+#include "nic/NicCoalesceGet.h"
+#include "nic/NicCoalesceSet.h"
+#include "nic/NicCsoGet.h"
+#include "nic/NicCsoSet.h"
+#include "nic/NicPauseParamsList.h"
+#include "nic/NicPauseParamsSet.h"
+#include "nic/NicRingCurrentGet.h"
+#include "nic/NicRingCurrentSet.h"
+#include "nic/NicRingPresetGet.h"
+#include "nic/NicSgGet.h"
+#include "nic/NicSgSet.h"
+#include "nic/NicSoftwareList.h"
+#include "nic/NicSoftwareSet.h"
+#include "nic/NicTsoGet.h"
+#include "nic/NicTsoSet.h"
 #include "vswitch/VirtualSwitchPortGroupAdd.h"
 #include "vswitch/VirtualSwitchPortGroupList.h"
 #include "vswitch/VirtualSwitchPortGroupPolicyFailoverGet.h"
@@ -206,24 +221,24 @@ extern "C" __attribute__((visibility("default"))) void AutoCli_RegisterNamespace
     // set: NicVlanStatsSet
 
     // network nic coalesce
-    // get: NicCoalesceGet
-    // set: NicCoalesceSet
+    nicCoalesce->RegisterNamespaceNode(NicCoalesceGet::New(), "get");
+    nicCoalesce->RegisterNamespaceNode(NicCoalesceSet::New(), "set");
 
     // network nic cso
-    // get: NicCsoGet
-    // set: NicCsoSet
+    nicCso->RegisterNamespaceNode(NicCsoGet::New(), "get");
+    nicCso->RegisterNamespaceNode(NicCsoSet::New(), "set");
 
     // network nic tso
-    // get: NicTsoGet
-    // set: NicTsoSet
+    nicTso->RegisterNamespaceNode(NicTsoGet::New(), "get");
+    nicTso->RegisterNamespaceNode(NicTsoSet::New(), "set");
 
     // network nic sg
-    // get: NicSgGet
-    // set: NicSgSet
+    nicSg->RegisterNamespaceNode(NicSgGet::New(), "get");
+    nicSg->RegisterNamespaceNode(NicSgSet::New(), "set");
 
     // network nic pauseParams
-    // list: NicPauseParamsList
-    // set: NicPauseParamsSet
+    nicPauseParams->RegisterNamespaceNode(NicPauseParamsList::New(), "list");
+    nicPauseParams->RegisterNamespaceNode(NicPauseParamsSet::New(), "set");
 
     // network nic register
     // dump: NicRegisterDump
@@ -239,19 +254,19 @@ extern "C" __attribute__((visibility("default"))) void AutoCli_RegisterNamespace
     // run: NicSelfTestRun
 
     // network nic software
-    // list: NicSoftwareList
-    // set: NicSoftwareSet
+    nicSoftware->RegisterNamespaceNode(NicSoftwareList::New(), "list");
+    nicSoftware->RegisterNamespaceNode(NicSoftwareSet::New(), "set");
 
     // network nic ring
     auto nicRingPreset = Attach(nicRing, "preset", "Commands to access preset NIC RX/TX ring buffer parameters");
     auto nicRingCurrent = Attach(nicRing, "current", "Commands to access current NIC RX/TX ring buffer parameters");
 
     // network nic ring preset
-    // get: NicRingPresetGet
+    nicRingPreset->RegisterNamespaceNode(NicRingPresetGet::New(), "get");
 
     // network nic ring current
-    // get: NicRingCurrentGet
-    // set: NicRingCurrentSet
+    nicRingCurrent->RegisterNamespaceNode(NicRingCurrentGet::New(), "get");
+    nicRingCurrent->RegisterNamespaceNode(NicRingCurrentSet::New(), "set");
 
     // network sriovnic
     // list: SriovNicList

@@ -26,9 +26,11 @@ std::unique_ptr<HostCtl::Network::Pnic> FindPnic(HostCtl::Network::NetworkInfo& 
     return pnic;
 }
 
-std::optional<std::vector<std::unique_ptr<HostCtl::Network::Pnic>>> SelectPnics(
-    HostCtl::Network::NetworkInfo& nics, const CallSpec::Input& input, const std::string& parameter,
-    MissingNic how, CallSpec::Output& output) {
+std::optional<std::vector<std::unique_ptr<HostCtl::Network::Pnic>>> SelectPnics(HostCtl::Network::NetworkInfo& nics,
+                                                                                const CallSpec::Input& input,
+                                                                                const std::string& parameter,
+                                                                                MissingNic how,
+                                                                                CallSpec::Output& output) {
     if (!input.IsSet(parameter)) return nics.GetPnics();
     std::unique_ptr<HostCtl::Network::Pnic> pnic = FindPnic(nics, input.GetString(parameter), how, output);
     if (!pnic) return std::nullopt;
