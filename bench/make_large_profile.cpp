@@ -1,6 +1,9 @@
 // Writes a large host profile on stdout, for the benchmark: about 1000
 // standard switches with 4096 ports in all, 2000 port groups, 256 kernel
-// interfaces and 10000 routes. Deterministic: the same profile every time.
+// interfaces, 10000 routes and 64 NICs with their driver data.
+// Deterministic: the same profile every time.
+#include <cstdint>
+#include <cstdio>
 #include <iostream>
 #include <string>
 
@@ -15,13 +18,119 @@ constexpr int kPorts = 4096;
 constexpr int kPortGroupsPerSwitch = 2;
 constexpr int kInterfaces = 256;
 constexpr int kRoutes = 10000;
-constexpr int kNics = 8;
+constexpr int kNics = 64;
 constexpr long long kPortBlock = 1LL << 24;
 
 std::string Mac(int a, int b) {
     char text[18];
     std::snprintf(text, sizeof text, "02:00:5e:%02x:%02x:%02x", a & 0xff, (b >> 8) & 0xff, b & 0xff);
     return text;
+}
+
+// Deterministic pseudo-random numbers for counters and register dumps.
+std::uint64_t Mix(int seed) {
+    std::uint64_t x = static_cast<std::uint64_t>(seed);
+    x ^= x >> 33;
+    x *= 0xff51afd7ed558ccdULL;
+    x ^= x >> 33;
+    return x;
+}
+
+// A NIC with the driver data of a real one: 10 Gb/s, fibre and copper
+// by turns, every eighth without a link, every sixteenth SR-IOV capable.
+Json Nic(int n) {
+    const bool fibre = n % 2 == 0;
+    const bool link = n % 8 != 7;
+    Json registers = Json::array();
+    for (int r = 0; r < 24; ++r) registers.push_back(Mix(n * 64 + r) & 0xffffffffULL);
+    std::string eeprom;
+    for (int b = 0; b < 128; ++b) {
+        char pair[3];
+        std::snprintf(pair, sizeof pair, "%02x", static_cast<unsigned>(Mix(n * 1024 + b) & 0xff));
+        eeprom += pair;
+    }
+    char pciDevice[16];
+    std::snprintf(pciDevice, sizeof pciDevice, "0000:%02x:00.%d", 0x10 + n / 2, n % 2);
+    const std::uint64_t rx = Mix(n) % 100000000, tx = Mix(n + 1000) % 100000000;
+    Json nic = {
+        {"name", "hwnic" + std::to_string(n)},
+        {"pciDevice", pciDevice},
+        {"vendorName", fibre ? "Corvex Systems" : "Larkspur Networks Inc."},
+        {"deviceName", fibre ? "CX4 10GbE SFP+ Adapter" : "LN540 10GBASE-T Controller"},
+        {"driver", fibre ? "cvx10" : "lrk10g"},
+        {"driverVersion", fibre ? "3.1.5" : "5.0.2"},
+        {"firmwareVersion", fibre ? "14.22.1002" : "2.40, 0x80001122"},
+        {"adminUp", true},
+        {"linkUp", link},
+        {"speed", link ? 10000 : 0},
+        {"duplex", link ? "full" : "half"},
+        {"autoNegotiation", !fibre},
+        {"mtu", n % 4 == 0 ? 9000 : 1500},
+        {"mac", Mac(0xa0, n)},
+        {"supportedPorts", fibre ? Json::array({4}) : Json::array({0})},
+        {"port", fibre ? 4 : 0},
+        {"transceiver", fibre ? "external" : "internal"},
+        {"phyAddress", fibre ? 0 : n % 32},
+        {"supportsAutoNegotiation", !fibre},
+        {"advertisedAutoNegotiation", !fibre},
+        {"advertisedLinkModes",
+         fibre ? Json::array({{{"speed", 10000}, {"duplex", "full"}}})
+               : Json::array({{{"speed", 1000}, {"duplex", "full"}}, {{"speed", 10000}, {"duplex", "full"}}})},
+        {"supportsWakeOn", !fibre},
+        {"wakeOn", fibre ? Json::array() : Json::array({5})},
+        {"supportsMessageLevel", true},
+        {"messageLevel", 7},
+        {"uplinkPortId", (n + 2) * kPortBlock + 1},
+        {"pause",
+         {{"supported", true},
+          {"autoNegotiate", !fibre},
+          {"rx", true},
+          {"tx", true},
+          {"rxResolution", link ? 1 : 0},
+          {"txResolution", link ? 1 : 0}}},
+        {"coalesce",
+         {{"adaptiveRx", true},
+          {"adaptiveTx", fibre},
+          {"sampleInterval", 0},
+          {"rxUsecs", 50},
+          {"rxMaxFrames", 0},
+          {"txUsecs", 50},
+          {"txMaxFrames", 0}}},
+        {"rings",
+         {{"preset", {{"rx", 8192}, {"rxMini", 0}, {"rxJumbo", 0}, {"tx", 8192}}},
+          {"current", {{"rx", 1024}, {"rxMini", 0}, {"rxJumbo", 0}, {"tx", 1024}}}}},
+        {"offloads", {{"rxChecksum", true}, {"txChecksum", true}, {"scatterGather", true}, {"tso", true}}},
+        {"softwareSimulation", {{"ipv6TsoExt", true}, {"ipv6CsoExt", true}, {"geneveOffload", fibre}}},
+        {"stats",
+         {{"rxPackets", rx},
+          {"txPackets", tx},
+          {"rxBytes", rx * 900},
+          {"txBytes", tx * 700},
+          {"rxDropped", rx % 97},
+          {"rxMulticast", rx / 200},
+          {"rxBroadcast", rx / 90},
+          {"txMulticast", tx / 800},
+          {"txBroadcast", tx / 1500}}},
+        {"registers", registers},
+        {"eeprom", eeprom},
+        {"eepromMagic", fibre ? 0x10de4d2a : 0x5a17c0fb},
+        {"selfTest",
+         {{"passed", link},
+          {"online", {std::string("Link test (on/offline)        ") + (link ? "0" : "1")}},
+          {"offline",
+           {"Register test (offline)       0", "Eeprom test (offline)         0",
+            std::string("Link test (on/offline)        ") + (link ? "0" : "1")}}}},
+    };
+    if (n % 16 == 0) {
+        Json vfs = Json::array();
+        for (int vf = 0; vf < 8; ++vf) {
+            char address[16];
+            std::snprintf(address, sizeof address, "0000:%02x:10.%d", 0x10 + n / 2, vf);
+            vfs.push_back({{"id", vf}, {"active", vf < 2}, {"pciAddress", address}, {"ownerWorldId", 0}});
+        }
+        nic["sriovVfs"] = vfs;
+    }
+    return nic;
 }
 
 Json Teaming(const Json& order) {
@@ -36,17 +145,7 @@ int main() {
     profile["system"] = {{"hostname", "large.example.test"}, {"ipv6Enabled", true}, {"maxPorts", 4608}};
 
     Json nics = Json::array();
-    for (int n = 0; n < kNics; ++n) {
-        nics.push_back({{"name", "hwnic" + std::to_string(n)},
-                        {"driver", "ixgben"},
-                        {"adminUp", true},
-                        {"linkUp", true},
-                        {"speed", 10000},
-                        {"duplex", "full"},
-                        {"mtu", 1500},
-                        {"mac", Mac(0xa0, n)},
-                        {"uplinkPortId", (n + 2) * kPortBlock + 1}});
-    }
+    for (int n = 0; n < kNics; ++n) nics.push_back(Nic(n));
 
     // The ports are spread over the switches: every switch gets kPorts /
     // kSwitches of them and the first ones one more, so there are kPorts in all.

@@ -8,6 +8,7 @@
 // library), which is why the table lives here rather than beside them.
 #include "ProfileChecks.h"
 
+#include <cctype>
 #include <cmath>
 #include <cstdint>
 #include <initializer_list>
@@ -32,7 +33,7 @@ using FieldChecks = std::vector<FieldCheck>;
 // written with a fraction or an exponent counts as that integer, as the
 // library reads it so.
 struct FieldCheck {
-    enum class Kind { String, Bool, Integer, Word, StringList, Object };
+    enum class Kind { String, Bool, Integer, Word, StringList, IntegerList, Object, ObjectList, HexBytes };
 
     const char* name;
     Kind kind;
@@ -59,6 +60,16 @@ FieldCheck Word(const char* name, std::initializer_list<const char*> words) {
 }
 FieldCheck Nested(const char* name, const FieldChecks& fields) {
     return {name, FieldCheck::Kind::Object, 0, 0, {}, &fields};
+}
+FieldCheck Integers(const char* name, std::int64_t min, std::uint64_t max) {
+    return {name, FieldCheck::Kind::IntegerList, min, max};
+}
+FieldCheck NestedList(const char* name, const FieldChecks& fields) {
+    return {name, FieldCheck::Kind::ObjectList, 0, 0, {}, &fields};
+}
+// A string of hex digit pairs, one pair a byte.
+FieldCheck Bytes(const char* name) {
+    return {name, FieldCheck::Kind::HexBytes};
 }
 
 // The policies a switch holds whole and a port group in part.
@@ -110,13 +121,123 @@ const FieldChecks kDvSwitch = {
     Integer("numPorts", kMinSwitchPorts, kMaxSwitchPorts),
     Names("uplinks"),
 };
+const FieldChecks kVlanStats = {Integer("vlanId", 0, 4095), Integer("rxPackets", 0, kUint64Max),
+                                Integer("txPackets", 0, kUint64Max)};
 const FieldChecks kPort = {
     // Port ids pass 32 bits on a host of many switches, whose id blocks
     // start at (n + 2) * 2^24.
-    Integer("id", 0, kInt64Max), Text("portset"), Word("type", {"vm", "kernel", "uplink", "internal"}), Text("client"),
+    Integer("id", 0, kInt64Max),
+    Text("portset"),
+    Word("type", {"vm", "kernel", "uplink", "internal"}),
+    Text("client"),
     Text("portgroup"),
+    Flag("vlanStatsEnabled"),
+    NestedList("vlanStats", kVlanStats),
 };
-const FieldChecks kNic = {Text("name"), Integer("uplinkPortId", 0, kInt64Max)};
+// Physical NICs and their driver data. Codes that no word names (ports,
+// wake-on-LAN modes) are allowed, as a driver may report them.
+constexpr std::uint64_t kUint32Max = std::numeric_limits<std::uint32_t>::max();
+const FieldChecks kLinkMode = {Integer("speed", 0, kUint32Max), Word("duplex", {"auto", "full", "half"})};
+const FieldChecks kPause = {Flag("supported"), Flag("autoNegotiate"),         Flag("rx"),
+                            Flag("tx"),        Integer("rxResolution", 0, 1), Integer("txResolution", 0, 1)};
+const FieldChecks kCoalesce = {
+    Flag("adaptiveRx"),
+    Flag("adaptiveTx"),
+    Integer("sampleInterval", 0, kUint32Max),
+    Integer("rxUsecs", 0, kUint32Max),
+    Integer("rxMaxFrames", 0, kUint32Max),
+    Integer("txUsecs", 0, kUint32Max),
+    Integer("txMaxFrames", 0, kUint32Max),
+};
+const FieldChecks kRingSizes = {Integer("rx", 0, kUint32Max), Integer("rxMini", 0, kUint32Max),
+                                Integer("rxJumbo", 0, kUint32Max), Integer("tx", 0, kUint32Max)};
+const FieldChecks kRings = {Nested("preset", kRingSizes), Nested("current", kRingSizes)};
+const FieldChecks kOffloads = {Flag("rxChecksum"), Flag("txChecksum"), Flag("scatterGather"), Flag("tso")};
+const FieldChecks kSoftwareSimulation = {
+    Flag("ipv4Cso"),
+    Flag("ipv4Tso"),
+    Flag("scatterGather"),
+    Flag("offsetBasedOffload"),
+    Flag("vxlanEncap"),
+    Flag("ipv6Tso"),
+    Flag("ipv6TsoExt"),
+    Flag("ipv6Cso"),
+    Flag("ipv6CsoExt"),
+    Flag("highDma"),
+    Flag("scatterGatherMultiPage"),
+    Flag("vlanTagging"),
+    Flag("vlanUntagging"),
+    Flag("geneveOffload"),
+};
+const FieldChecks kNicStats = {
+    Integer("rxPackets", 0, kUint64Max),       Integer("txPackets", 0, kUint64Max),
+    Integer("rxBytes", 0, kUint64Max),         Integer("txBytes", 0, kUint64Max),
+    Integer("rxDropped", 0, kUint64Max),       Integer("txDropped", 0, kUint64Max),
+    Integer("rxMulticast", 0, kUint64Max),     Integer("rxBroadcast", 0, kUint64Max),
+    Integer("txMulticast", 0, kUint64Max),     Integer("txBroadcast", 0, kUint64Max),
+    Integer("rxErrors", 0, kUint64Max),        Integer("rxLengthErrors", 0, kUint64Max),
+    Integer("rxOverErrors", 0, kUint64Max),    Integer("rxCrcErrors", 0, kUint64Max),
+    Integer("rxFrameErrors", 0, kUint64Max),   Integer("rxFifoErrors", 0, kUint64Max),
+    Integer("rxMissedErrors", 0, kUint64Max),  Integer("txErrors", 0, kUint64Max),
+    Integer("txAbortedErrors", 0, kUint64Max), Integer("txCarrierErrors", 0, kUint64Max),
+    Integer("txFifoErrors", 0, kUint64Max),    Integer("txHeartbeatErrors", 0, kUint64Max),
+    Integer("txWindowErrors", 0, kUint64Max),
+};
+const FieldChecks kSelfTest = {Flag("passed"), Names("online"), Names("offline")};
+const FieldChecks kVfStats = {
+    Integer("rxUnicastPackets", 0, kUint64Max),   Integer("rxUnicastBytes", 0, kUint64Max),
+    Integer("rxMulticastPackets", 0, kUint64Max), Integer("rxMulticastBytes", 0, kUint64Max),
+    Integer("rxBroadcastPackets", 0, kUint64Max), Integer("rxBroadcastBytes", 0, kUint64Max),
+    Integer("rxOutOfBufferDrops", 0, kUint64Max), Integer("rxErrorDrops", 0, kUint64Max),
+    Integer("rxLroPackets", 0, kUint64Max),       Integer("rxLroBytes", 0, kUint64Max),
+    Integer("txUnicastPackets", 0, kUint64Max),   Integer("txUnicastBytes", 0, kUint64Max),
+    Integer("txMulticastPackets", 0, kUint64Max), Integer("txMulticastBytes", 0, kUint64Max),
+    Integer("txBroadcastPackets", 0, kUint64Max), Integer("txBroadcastBytes", 0, kUint64Max),
+    Integer("txErrors", 0, kUint64Max),           Integer("txDiscards", 0, kUint64Max),
+    Integer("txTsoPackets", 0, kUint64Max),       Integer("txTsoBytes", 0, kUint64Max),
+};
+const FieldChecks kVf = {Integer("id", 0, 255), Flag("active"), Text("pciAddress"),
+                         Integer("ownerWorldId", 0, kUint32Max), Nested("stats", kVfStats)};
+const FieldChecks kNic = {
+    Text("name"),
+    Text("pciDevice"),
+    Text("vendorName"),
+    Text("deviceName"),
+    Text("driver"),
+    Text("driverVersion"),
+    Text("firmwareVersion"),
+    Flag("adminUp"),
+    Flag("linkUp"),
+    Integer("speed", 0, kUint32Max),
+    Word("duplex", {"full", "half"}),
+    Flag("autoNegotiation"),
+    Integer("mtu", 0, kUint32Max),
+    Text("mac"),
+    Integers("supportedPorts", 0, kInt32Max),
+    Integer("port", 0, kInt32Max),
+    Word("transceiver", {"internal", "external"}),
+    Integer("phyAddress", 0, kInt32Max),
+    Text("virtualAddress"),
+    Flag("supportsAutoNegotiation"),
+    Flag("advertisedAutoNegotiation"),
+    NestedList("advertisedLinkModes", kLinkMode),
+    Flag("supportsWakeOn"),
+    Integers("wakeOn", 0, kInt32Max),
+    Flag("supportsMessageLevel"),
+    Integer("messageLevel", 0, kUint32Max),
+    Integer("uplinkPortId", 0, kInt64Max),
+    Nested("pause", kPause),
+    Nested("coalesce", kCoalesce),
+    Nested("rings", kRings),
+    Nested("offloads", kOffloads),
+    Nested("softwareSimulation", kSoftwareSimulation),
+    Nested("stats", kNicStats),
+    Integers("registers", 0, kUint32Max),
+    Bytes("eeprom"),
+    Integer("eepromMagic", 0, kUint32Max),
+    Nested("selfTest", kSelfTest),
+    NestedList("sriovVfs", kVf),
+};
 const FieldChecks kSystem = {
     Flag("ipv6Enabled"),
     Integer("maxPorts", 1, kInt64Max),
@@ -197,10 +318,42 @@ std::string Mismatch(const FieldCheck& check, const Json& value, const std::stri
                 }
             }
             return "";
+        case FieldCheck::Kind::IntegerList:
+            if (!value.is_array()) return "must be an array of integers" + found;
+            for (std::size_t i = 0; i < value.size(); ++i) {
+                if (!IsWhole(value[i], check.min, check.max)) {
+                    return "item " + std::to_string(i) + " must be " + Range(check) + std::string(", not ") +
+                           (value[i].is_number() ? value[i].dump() : value[i].type_name());
+                }
+            }
+            return "";
         case FieldCheck::Kind::Object:
             if (!value.is_object()) return "must be a JSON object" + found;
             CheckFields(*check.fields, value, where);
             return "";
+        case FieldCheck::Kind::ObjectList:
+            if (!value.is_array()) return "must be an array of JSON objects" + found;
+            for (std::size_t i = 0; i < value.size(); ++i) {
+                const std::string item = where + "[" + std::to_string(i) + "]";
+                if (!value[i].is_object()) {
+                    throw ProfileError(item + ": must be a JSON object, not " +
+                                       (value[i].is_number() ? value[i].dump() : value[i].type_name()));
+                }
+                CheckFields(*check.fields, value[i], item);
+            }
+            return "";
+        case FieldCheck::Kind::HexBytes: {
+            if (!value.is_string()) return "must be a string of hex digit pairs" + found;
+            const std::string& text = value.get_ref<const std::string&>();
+            if (text.size() % 2 != 0) return "must be a string of hex digit pairs, not an odd number of digits";
+            for (std::size_t i = 0; i < text.size(); ++i) {
+                if (!std::isxdigit(static_cast<unsigned char>(text[i]))) {
+                    return "must be a string of hex digit pairs, not '" + std::string(1, text[i]) + "' at position " +
+                           std::to_string(i);
+                }
+            }
+            return "";
+        }
     }
     return "";
 }

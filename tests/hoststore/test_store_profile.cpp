@@ -131,6 +131,51 @@ TEST(ProfileTest, FieldsTheLibraryReadsKeepTheirTypeAndRange) {
               "(accepted)");
 }
 
+TEST(ProfileTest, NicDriverDataIsCheckedToItsDepth) {
+    const auto nic = [](const std::string& fields) {
+        return ErrorOf(WithSections(R"("nics": [{"name": "hwnic0"}, {"name": "hwnic1", )" + fields + "}]"));
+    };
+    EXPECT_EQ(nic(R"("speed": 4294967296)"),
+              "profile t.json: nics[1].speed: must be an integer from 0 to 4294967295, not 4294967296");
+    EXPECT_EQ(nic(R"("duplex": "auto")"), "profile t.json: nics[1].duplex: must be one of full, half, not 'auto'");
+    EXPECT_EQ(nic(R"("pciDevice": null)"), "profile t.json: nics[1].pciDevice: must be a string, not null");
+    EXPECT_EQ(nic(R"("supportedPorts": [0, -1])"),
+              "profile t.json: nics[1].supportedPorts: item 1 must be an integer from 0 to 2147483647, not -1");
+    EXPECT_EQ(nic(R"("registers": 5)"), "profile t.json: nics[1].registers: must be an array of integers, not 5");
+    EXPECT_EQ(nic(R"("registers": [1, 4294967296])"),
+              "profile t.json: nics[1].registers: item 1 must be an integer from 0 to 4294967295, not 4294967296");
+    EXPECT_EQ(nic(R"("advertisedLinkModes": [{"speed": 10, "duplex": "full"}, {"duplex": "both"}])"),
+              "profile t.json: nics[1].advertisedLinkModes[1].duplex: must be one of auto, full, half, not 'both'");
+    EXPECT_EQ(nic(R"("advertisedLinkModes": [7])"),
+              "profile t.json: nics[1].advertisedLinkModes[0]: must be a JSON object, not 7");
+    EXPECT_EQ(nic(R"("rings": {"preset": {"rx": -1}})"),
+              "profile t.json: nics[1].rings.preset.rx: must be an integer from 0 to 4294967295, not -1");
+    EXPECT_EQ(nic(R"("coalesce": {"rxUsecs": 1.5})"),
+              "profile t.json: nics[1].coalesce.rxUsecs: must be an integer from 0 to 4294967295, not 1.5");
+    EXPECT_EQ(nic(R"("selfTest": {"online": ["ok", 1]})"),
+              "profile t.json: nics[1].selfTest.online: item 1 must be a string, not 1");
+    EXPECT_EQ(nic(R"("eeprom": "02a1f")"),
+              "profile t.json: nics[1].eeprom: must be a string of hex digit pairs, not an odd number of digits");
+    EXPECT_EQ(nic(R"("eeprom": "02g1")"),
+              "profile t.json: nics[1].eeprom: must be a string of hex digit pairs, not 'g' at position 2");
+    EXPECT_EQ(nic(R"("sriovVfs": [{"id": 0}, {"id": 256}])"),
+              "profile t.json: nics[1].sriovVfs[1].id: must be an integer from 0 to 255, not 256");
+    EXPECT_EQ(nic(R"("sriovVfs": [{"id": 0, "stats": {"txErrors": -3}}])"),
+              "profile t.json: nics[1].sriovVfs[0].stats.txErrors: must be an integer from 0 to "
+              "18446744073709551615, not -3");
+    EXPECT_EQ(nic(R"("stats": {"rxCrcErrors": "0"})"),
+              "profile t.json: nics[1].stats.rxCrcErrors: must be an integer from 0 to 18446744073709551615, not "
+              "string");
+    EXPECT_EQ(ErrorOf(WithSections(R"("ports": [{"id": 1, "portset": "a", "vlanStats": [{"vlanId": 4096}]}])")),
+              "profile t.json: ports[0].vlanStats[0].vlanId: must be an integer from 0 to 4095, not 4096");
+    EXPECT_EQ(ErrorOf(WithSections(R"("ports": [{"id": 1, "portset": "a", "vlanStatsEnabled": 1}])")),
+              "profile t.json: ports[0].vlanStatsEnabled: must be true or false, not 1");
+    // Codes no word names, the edges of each range, and an empty EEPROM.
+    EXPECT_EQ(nic(R"("port": 255, "wakeOn": [9, 0], "messageLevel": 4294967295, "eeprom": "", "eepromMagic": 0,
+                     "sriovVfs": [], "registers": [4294967295], "mtu": 9000.0, "pause": {"rxResolution": 1})"),
+              "(accepted)");
+}
+
 TEST(ProfileTest, NumbersBeyondTheParserAreRefusedWithTheirPlace) {
     const std::string huge = "1" + std::string(400, '0');
     const std::string message = ErrorOf(WithSections("\n\"system\": {\"x\": \"9e999\", \"maxPorts\": " + huge + "}"));

@@ -1,6 +1,7 @@
 #include "hostctl/network/NetworkFactory.h"
 
 #include "Operation.h"
+#include "hostctl/network/NetworkInfoImpl.h"
 #include "hostctl/network/ip/PldNic.h"
 #include "hostctl/network/vswitch/SwitchImpl.h"
 #include "network/vswitch/VswitchRecords.h"
@@ -29,6 +30,10 @@ std::unique_ptr<PortGroup> NetworkFactory::GetPortGroupByName(const std::string&
     if (!portGroup) return nullptr;
     return std::make_unique<PldCtl::Network::PortGroupImpl>(
         std::make_shared<const PortGroupRecord>(std::move(*portGroup)));
+}
+
+std::unique_ptr<NetworkInfo> NetworkFactory::GetNetworkInfo() {
+    return std::make_unique<PldCtl::Network::NetworkInfoImpl>();
 }
 
 }  // namespace Network

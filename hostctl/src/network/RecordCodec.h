@@ -116,23 +116,12 @@ bool Read(JsonReader& reader, Int& out) {
     return AssignInteger(static_cast<std::int64_t>(real), out);
 }
 
-inline bool Read(JsonReader& reader, std::vector<std::string>& out) {
-    if (reader.Next() != JsonReader::Kind::Array) {
-        reader.Skip();
-        return false;
-    }
-    std::vector<std::string> items;
-    // One item of another type makes the whole field so.
-    bool names = true;
-    reader.BeginArray();
-    while (reader.NextItem()) {
-        std::string item;
-        names = Read(reader, item) && names;
-        if (names) items.push_back(std::move(item));
-    }
-    if (names) out = std::move(items);
-    return names;
-}
+template <typename Record>
+void ReadFields(JsonReader& reader, Record& record);
+template <typename Record, std::enable_if_t<IsRecord<Record>::value, int> = 0>
+bool Read(JsonReader& reader, Record& out);
+template <typename T>
+bool Read(JsonReader& reader, std::vector<T>& out);
 
 template <typename T>
 bool Read(JsonReader& reader, std::optional<T>& out) {
@@ -142,10 +131,7 @@ bool Read(JsonReader& reader, std::optional<T>& out) {
     return true;
 }
 
-template <typename Record>
-void ReadFields(JsonReader& reader, Record& record);
-
-template <typename Record, std::enable_if_t<IsRecord<Record>::value, int> = 0>
+template <typename Record, std::enable_if_t<IsRecord<Record>::value, int>>
 bool Read(JsonReader& reader, Record& out) {
     if (reader.Next() != JsonReader::Kind::Object) {
         reader.Skip();
@@ -153,6 +139,26 @@ bool Read(JsonReader& reader, Record& out) {
     }
     ReadFields(reader, out);
     return true;
+}
+
+// An array of strings, numbers or records.
+template <typename T>
+bool Read(JsonReader& reader, std::vector<T>& out) {
+    if (reader.Next() != JsonReader::Kind::Array) {
+        reader.Skip();
+        return false;
+    }
+    std::vector<T> items;
+    // One item of another type makes the whole field so.
+    bool fits = true;
+    reader.BeginArray();
+    while (reader.NextItem()) {
+        T item{};
+        fits = Read(reader, item) && fits;
+        if (fits) items.push_back(std::move(item));
+    }
+    if (fits) out = std::move(items);
+    return fits;
 }
 
 // A member the record does not name is skipped; of members named twice the
@@ -172,6 +178,23 @@ void ReadFields(JsonReader& reader, Record& record) {
 }
 
 template <typename T>
+bool Equal(const T& a, const T& b);
+
+template <typename T>
+bool Equal(const std::vector<T>& a, const std::vector<T>& b) {
+    if (a.size() != b.size()) return false;
+    for (std::size_t i = 0; i < a.size(); ++i) {
+        if (!Equal(a[i], b[i])) return false;
+    }
+    return true;
+}
+
+template <typename T>
+bool Equal(const std::optional<T>& a, const std::optional<T>& b) {
+    return a.has_value() == b.has_value() && (!a || Equal(*a, *b));
+}
+
+template <typename T>
 bool Equal(const T& a, const T& b) {
     if constexpr (IsRecord<T>::value) {
         bool equal = true;
@@ -183,6 +206,16 @@ bool Equal(const T& a, const T& b) {
 }
 
 // The stored form of a member (nested records: Encode).
+template <typename T>
+Store::Json ToJson(const T& value);
+
+template <typename T>
+Store::Json ToJson(const std::vector<T>& values) {
+    Store::Json array = Store::Json::array();
+    for (const T& value : values) array.push_back(ToJson(value));
+    return array;
+}
+
 template <typename T>
 Store::Json ToJson(const T& value) {
     if constexpr (IsRecord<T>::value) {
@@ -219,7 +252,14 @@ void MergeField(Store::Json& stored, std::string_view name, const T& before, con
 template <typename T>
 void MergeField(Store::Json& stored, std::string_view name, const std::optional<T>& before,
                 const std::optional<T>& after) {
-    if (before == after) return;
+    if (Equal(before, after)) return;
+    if constexpr (IsRecord<T>::value) {
+        // A nested object that stays keeps the fields the record does not know.
+        if (before && after) {
+            Merge(stored[std::string(name)], *before, *after);
+            return;
+        }
+    }
     if (after) {
         stored[std::string(name)] = ToJson(*after);
     } else {

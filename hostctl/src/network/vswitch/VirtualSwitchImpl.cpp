@@ -96,6 +96,53 @@ std::vector<std::string> PortsetImpl::GetUplinks() const {
     return record_->uplinks;
 }
 
+namespace {
+
+// The uplink port of `nic` on `vswitch`, found through the NIC's own record
+// rather than by listing the switch's ports; HostCtlException when the NIC
+// is no uplink of the switch.
+Detail::StoredObject<PortRecord> RequireUplinkPort(Transaction& t, const std::string& vswitch, const std::string& nic) {
+    auto notUplink = [&]() { throw HostCtlException(nic + " is not an uplink of " + vswitch); };
+    std::optional<Detail::NicRecord> pnic = Detail::Get<Detail::NicRecord>(t, nic);
+    if (!pnic || pnic->uplinkPortId == 0) notUplink();
+    std::optional<Detail::StoredObject<PortRecord>> port =
+        Detail::Find<PortRecord>(t, std::to_string(pnic->uplinkPortId));
+    if (!port || port->record.portset != vswitch || port->record.client != nic) notUplink();
+    return std::move(*port);
+}
+
+}  // namespace
+
+std::vector<std::unique_ptr<HostCtl::Network::VlanStats>> PortsetImpl::GetUplinkVlanStats(
+    const std::string& uplink) const {
+    Store::HostStore& store = Detail::EnterOperation("PortsetImpl::GetUplinkVlanStats", GetName());
+    std::vector<std::unique_ptr<HostCtl::Network::VlanStats>> stats;
+    store.Read([&](Transaction& t) {
+        const PortRecord port = RequireUplinkPort(t, GetName(), uplink).record;
+        if (!port.vlanStatsEnabled) return;
+        for (const Detail::VlanStatsRecord& vlan : port.vlanStats) {
+            auto entry = std::make_unique<HostCtl::Network::VlanStats>();
+            entry->vlanId = static_cast<std::uint16_t>(vlan.vlanId);
+            entry->rxPackets = vlan.rxPackets;
+            entry->txPackets = vlan.txPackets;
+            stats.push_back(std::move(entry));
+        }
+    });
+    return stats;
+}
+
+void PortsetImpl::SetUplinkVlanStatsEnabled(const std::string& uplink, bool enabled) {
+    Store::HostStore& store = Detail::EnterOperation("PortsetImpl::SetUplinkVlanStatsEnabled", GetName());
+    store.Change([&](Transaction& t) {
+        Detail::StoredObject<PortRecord> port = RequireUplinkPort(t, GetName(), uplink);
+        PortRecord edited = port.record;
+        edited.vlanStatsEnabled = enabled;
+        // Counting starts afresh each time it is turned on.
+        if (!enabled) edited.vlanStats.clear();
+        Detail::Write(t, port, edited);
+    });
+}
+
 // ---------------------------------------------------------- VirtualSwitchImpl
 
 VirtualSwitchImpl::VirtualSwitchImpl(std::shared_ptr<const VswitchRecord> record) : PortsetImpl(std::move(record)) {}

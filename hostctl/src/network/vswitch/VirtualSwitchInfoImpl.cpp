@@ -29,11 +29,15 @@ VirtualSwitchInfoImpl::VirtualSwitchInfoImpl() = default;
 
 VirtualSwitchInfoImpl::~VirtualSwitchInfoImpl() = default;
 
-std::vector<std::unique_ptr<VirtualSwitch>> VirtualSwitchInfoImpl::GetVirtualSwitches() {
-    Store::HostStore& store = Detail::EnterOperation("VirtualSwitchInfoImpl::GetVirtualSwitches");
+namespace {
+
+// Every standard switch of the host, in its order, each with its port
+// counts and port groups.
+template <typename Switch>
+std::vector<std::unique_ptr<Switch>> ListSwitches(Store::HostStore& store) {
     // One pass over each collection for all switches, instead of a few
     // queries per switch: listing a thousand switches stays quick.
-    std::vector<std::unique_ptr<VirtualSwitch>> switches;
+    std::vector<std::unique_ptr<Switch>> switches;
     store.Read([&](Transaction& t) {
         const auto ports =
             t.CountGroups(PortRecord::kSection, std::string(), {FieldTest{PortRecord::kClientField, std::nullopt}});
@@ -52,6 +56,16 @@ std::vector<std::unique_ptr<VirtualSwitch>> VirtualSwitchInfoImpl::GetVirtualSwi
         }
     });
     return switches;
+}
+
+}  // namespace
+
+std::vector<std::unique_ptr<VirtualSwitch>> VirtualSwitchInfoImpl::GetVirtualSwitches() {
+    return ListSwitches<VirtualSwitch>(Detail::EnterOperation("VirtualSwitchInfoImpl::GetVirtualSwitches"));
+}
+
+std::vector<std::unique_ptr<HostCtl::Network::Portset>> VirtualSwitchInfoImpl::GetAllSwitches() {
+    return ListSwitches<HostCtl::Network::Portset>(Detail::EnterOperation("VirtualSwitchInfoImpl::GetAllSwitches"));
 }
 
 std::unique_ptr<VirtualSwitch> VirtualSwitchInfoImpl::GetVirtualSwitchByName(const std::string& name) {

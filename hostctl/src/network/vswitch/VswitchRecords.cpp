@@ -99,6 +99,16 @@ struct RecordFields<PortGroupRecord> {
 };
 
 template <>
+struct RecordFields<VlanStatsRecord> {
+    static constexpr auto All() {
+        return std::make_tuple(
+            Field("vlanId", &VlanStatsRecord::vlanId),
+            Field("rxPackets", &VlanStatsRecord::rxPackets),
+            Field("txPackets", &VlanStatsRecord::txPackets));
+    }
+};
+
+template <>
 struct RecordFields<PortRecord> {
     static constexpr auto All() {
         return std::make_tuple(
@@ -106,7 +116,9 @@ struct RecordFields<PortRecord> {
             Field("portset", &PortRecord::portset),
             Field(PortRecord::kTypeField, &PortRecord::type),
             Field(PortRecord::kClientField, &PortRecord::client),
-            Field(PortRecord::kPortGroupField, &PortRecord::portgroup));
+            Field(PortRecord::kPortGroupField, &PortRecord::portgroup),
+            Field("vlanStatsEnabled", &PortRecord::vlanStatsEnabled),
+            Field("vlanStats", &PortRecord::vlanStats));
     }
 };
 // clang-format on

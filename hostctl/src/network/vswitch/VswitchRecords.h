@@ -81,6 +81,13 @@ struct PortGroupRecord {
     ShapingRecord shaping;
 };
 
+// The packets of one VLAN seen on an uplink port.
+struct VlanStatsRecord {
+    std::int64_t vlanId = 0;
+    std::uint64_t rxPackets = 0;
+    std::uint64_t txPackets = 0;
+};
+
 // A port of a standard or distributed switch, as far as switches use it.
 struct PortRecord {
     static constexpr const char* kSection = Store::Section::kPorts;
@@ -95,6 +102,9 @@ struct PortRecord {
     std::string type = "vm";
     std::string client;  // "" for a free port
     std::string portgroup;
+    // Uplink ports: per-VLAN counting, and its counters while it is on.
+    bool vlanStatsEnabled = false;
+    std::vector<VlanStatsRecord> vlanStats;
 };
 
 // A stored policy as the library's policy type, and back. Reading throws
