@@ -57,6 +57,15 @@ $ orvixcli network nic coalesce get --formatter=simple
    Adaptive TX: Off
    Sample interval seconds: 0
 
+   NIC: hwnic6
+   RX microseconds: N/A
+   RX maximum frames: N/A
+   TX microseconds: N/A
+   TX Maximum frames: N/A
+   Adaptive RX: N/A
+   Adaptive TX: N/A
+   Sample interval seconds: N/A
+
 ## A set reads the record first; when that fails nothing is written.
 $ orvixcli network nic coalesce set -n hwnic3 -r 1
 ! Driver of hwnic3 timed out

@@ -1,6 +1,6 @@
 ## network nic coalesce get and set on the default host. Counts and the
 ## sample interval are shown as decimal text, the adaptive switches "On" or
-## "Off".
+## "Off"; the pseudo NIC hwnic6 cannot report coalescing ("N/A").
 $ orvixcli network nic coalesce get
 NIC     RX microseconds  RX maximum frames  TX microseconds  TX Maximum frames  Adaptive RX  Adaptive TX  Sample interval seconds
 ------  ---------------  -----------------  ---------------  -----------------  -----------  -----------  -----------------------
@@ -10,6 +10,7 @@ hwnic2  50               64                 50               64                 
 hwnic3  50               64                 50               64                 On           On           2
 hwnic4  8                128                16               128                On           Off          1
 hwnic5  0                1                  0                1                  Off          Off          0
+hwnic6  N/A              N/A                N/A              N/A                N/A          N/A          N/A
 
 $ orvixcli network nic coalesce get -n hwnic4 --formatter=simple
    NIC: hwnic4
@@ -98,6 +99,7 @@ hwnic2  50               64                 50               64                 
 hwnic3  50               64                 50               64                 On           On           2
 hwnic4  8                128                16               128                On           Off          1
 hwnic5  0                0                  7                1                  On           Off          0
+hwnic6  N/A              N/A                N/A              N/A                N/A          N/A          N/A
 
 $ orvixcli network nic coalesce set -n hwnic9 -r 1
 ! Pnic with name hwnic9 not found

@@ -1,6 +1,7 @@
 ## network nic cso, tso and sg get and set on the default host. Without
 ## --hwnic every NIC is listed in the host's order; hwnic3 has TCP
-## segmentation offload off, hwnic5 only checksums what it receives.
+## segmentation offload off, hwnic5 only checksums what it receives, and the
+## driver of the pseudo NIC hwnic6 cannot report offloads ("N/A").
 $ orvixcli network nic cso get
 NIC     RX Checksum Offload  TX Checksum Offload
 ------  -------------------  -------------------
@@ -10,6 +11,7 @@ hwnic2  on                   on
 hwnic3  on                   on
 hwnic4  on                   on
 hwnic5  on                   off
+hwnic6  N/A                  N/A
 
 $ orvixcli network nic tso get
 NIC     Value
@@ -20,6 +22,7 @@ hwnic2  on
 hwnic3  off
 hwnic4  on
 hwnic5  off
+hwnic6  N/A
 
 $ orvixcli network nic sg get
 NIC     Value
@@ -30,6 +33,7 @@ hwnic2  on
 hwnic3  on
 hwnic4  on
 hwnic5  off
+hwnic6  N/A
 
 ## One NIC, in the other formatters.
 $ orvixcli network nic cso get --hwnic=hwnic5 --formatter=json
@@ -111,6 +115,9 @@ $ orvixcli network nic tso get --formatter=simple
    NIC: hwnic5
    Value: off
 
+   NIC: hwnic6
+   Value: N/A
+
 $ orvixcli network nic sg get
 NIC     Value
 ------  -----
@@ -120,6 +127,7 @@ hwnic2  on
 hwnic3  on
 hwnic4  on
 hwnic5  off
+hwnic6  N/A
 
 $ orvixcli network nic cso get
 NIC     RX Checksum Offload  TX Checksum Offload
@@ -130,6 +138,7 @@ hwnic2  on                   on
 hwnic3  on                   on
 hwnic4  on                   on
 hwnic5  on                   on
+hwnic6  N/A                  N/A
 
 ## The enable value is 0 or 1, and both options are required.
 $ orvixcli network nic tso set -n hwnic0 -e 2

@@ -1,6 +1,7 @@
 ## network nic pauseParams list and set on the default host. hwnic1 has a
 ## negotiated result for RX only, so no resolution is available at all;
-## hwnic5 does not support pause parameters and lists every bool false.
+## hwnic5 and hwnic6 do not support pause parameters and list every bool
+## false.
 $ orvixcli network nic pauseParams list
 NIC     Pause Params Supported  Pause RX  Pause TX  Auto Negotiation  Auto Negotiation Resolution Avail  RX Auto Negotiation Resolution  TX Auto Negotiation Resolution
 ------  ----------------------  --------  --------  ----------------  ---------------------------------  ------------------------------  ------------------------------
@@ -10,6 +11,7 @@ hwnic2  true                    false     false     false             false     
 hwnic3  true                    false     false     false             false                              false                           false
 hwnic4  true                    true      true      true              true                               true                            true
 hwnic5  false                   false     false     false             false                              false                           false
+hwnic6  false                   false     false     false             false                              false                           false
 
 $ orvixcli network nic pauseParams list -n hwnic1 --formatter=json
 [
@@ -99,6 +101,16 @@ $ orvixcli network nic pauseParams list --formatter=json
   },
   {
     "NIC": "hwnic5",
+    "Pause Params Supported": false,
+    "Pause RX": false,
+    "Pause TX": false,
+    "Auto Negotiation": false,
+    "Auto Negotiation Resolution Avail": false,
+    "RX Auto Negotiation Resolution": false,
+    "TX Auto Negotiation Resolution": false
+  },
+  {
+    "NIC": "hwnic6",
     "Pause Params Supported": false,
     "Pause RX": false,
     "Pause TX": false,

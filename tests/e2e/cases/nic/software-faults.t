@@ -12,6 +12,7 @@ hwnic2  N/A       N/A       N/A             N/A                   N/A          N
 hwnic3  off       on        off             off                   off          on              off       off           off       off           off       off                off           off
 hwnic4  off       off       off             off                   off          off             off       off           off       off           off       off                off           off
 hwnic5  on        on        on              off                   off          on              on        off           on        off           off       off                on            off
+hwnic6  off       off       off             off                   off          off             off       off           off       off           off       off                off           off
 
 $ orvix-hostsim fault add NetworkInfoImpl::GetPnics --message "Unable to list the NICs: store busy" --count 1
 2
@@ -40,3 +41,4 @@ hwnic2  off       off       off             off                   off          o
 hwnic3  off       on        off             off                   off          on              off       off           off       off           off       off                off           off
 hwnic4  off       off       off             off                   off          off             off       off           off       off           off       off                off           off
 hwnic5  on        on        on              off                   off          on              on        off           on        off           off       off                on            off
+hwnic6  off       off       off             off                   off          off             off       off           off       off           off       off                off           off
