@@ -12,16 +12,31 @@
 #include "framework/AutoCli.h"
 #include "ip/IpGet.h"
 #include "ip/IpSet.h"
+#include "nic/NicCoalesceGet.h"
+#include "nic/NicCoalesceSet.h"
+#include "nic/NicCsoGet.h"
+#include "nic/NicCsoSet.h"
 #include "nic/NicDown.h"
 #include "nic/NicEepromChange.h"
 #include "nic/NicEepromDump.h"
 #include "nic/NicGet.h"
 #include "nic/NicList.h"
 #include "nic/NicNegotiationRestart.h"
+#include "nic/NicPauseParamsList.h"
+#include "nic/NicPauseParamsSet.h"
 #include "nic/NicRegisterDump.h"
+#include "nic/NicRingCurrentGet.h"
+#include "nic/NicRingCurrentSet.h"
+#include "nic/NicRingPresetGet.h"
 #include "nic/NicSelfTestRun.h"
 #include "nic/NicSet.h"
+#include "nic/NicSgGet.h"
+#include "nic/NicSgSet.h"
+#include "nic/NicSoftwareList.h"
+#include "nic/NicSoftwareSet.h"
 #include "nic/NicStatsGet.h"
+#include "nic/NicTsoGet.h"
+#include "nic/NicTsoSet.h"
 #include "nic/NicUp.h"
 #include "nic/NicVlanStatsGet.h"
 #include "nic/NicVlanStatsSet.h"
@@ -222,24 +237,24 @@ extern "C" __attribute__((visibility("default"))) void AutoCli_RegisterNamespace
     nicVlanStats->RegisterNamespaceNode(NicVlanStatsSet::New(), "set");
 
     // network nic coalesce
-    // get: NicCoalesceGet
-    // set: NicCoalesceSet
+    nicCoalesce->RegisterNamespaceNode(NicCoalesceGet::New(), "get");
+    nicCoalesce->RegisterNamespaceNode(NicCoalesceSet::New(), "set");
 
     // network nic cso
-    // get: NicCsoGet
-    // set: NicCsoSet
+    nicCso->RegisterNamespaceNode(NicCsoGet::New(), "get");
+    nicCso->RegisterNamespaceNode(NicCsoSet::New(), "set");
 
     // network nic tso
-    // get: NicTsoGet
-    // set: NicTsoSet
+    nicTso->RegisterNamespaceNode(NicTsoGet::New(), "get");
+    nicTso->RegisterNamespaceNode(NicTsoSet::New(), "set");
 
     // network nic sg
-    // get: NicSgGet
-    // set: NicSgSet
+    nicSg->RegisterNamespaceNode(NicSgGet::New(), "get");
+    nicSg->RegisterNamespaceNode(NicSgSet::New(), "set");
 
     // network nic pauseParams
-    // list: NicPauseParamsList
-    // set: NicPauseParamsSet
+    nicPauseParams->RegisterNamespaceNode(NicPauseParamsList::New(), "list");
+    nicPauseParams->RegisterNamespaceNode(NicPauseParamsSet::New(), "set");
 
     // network nic register
     nicRegister->RegisterNamespaceNode(NicRegisterDump::New(), "dump");
@@ -255,19 +270,19 @@ extern "C" __attribute__((visibility("default"))) void AutoCli_RegisterNamespace
     nicSelftest->RegisterNamespaceNode(NicSelfTestRun::New(), "run");
 
     // network nic software
-    // list: NicSoftwareList
-    // set: NicSoftwareSet
+    nicSoftware->RegisterNamespaceNode(NicSoftwareList::New(), "list");
+    nicSoftware->RegisterNamespaceNode(NicSoftwareSet::New(), "set");
 
     // network nic ring
     auto nicRingPreset = Attach(nicRing, "preset", "Commands to access preset NIC RX/TX ring buffer parameters");
     auto nicRingCurrent = Attach(nicRing, "current", "Commands to access current NIC RX/TX ring buffer parameters");
 
     // network nic ring preset
-    // get: NicRingPresetGet
+    nicRingPreset->RegisterNamespaceNode(NicRingPresetGet::New(), "get");
 
     // network nic ring current
-    // get: NicRingCurrentGet
-    // set: NicRingCurrentSet
+    nicRingCurrent->RegisterNamespaceNode(NicRingCurrentGet::New(), "get");
+    nicRingCurrent->RegisterNamespaceNode(NicRingCurrentSet::New(), "set");
 
     // network sriovnic
     sriovnic->RegisterNamespaceNode(SriovNicList::New(), "list");
