@@ -12,8 +12,8 @@
 
 #include "common/CommandSupport.h"
 #include "framework/CallSpec.h"
+#include "hostctl/network/NetworkInfo.h"
 #include "hostctl/network/NetworkInfoImpl.h"
-#include "hostctl/network/nic/Pnic.h"
 #include "hostctl/network/vswitch/VirtualSwitch.h"
 
 namespace OrvixCli {

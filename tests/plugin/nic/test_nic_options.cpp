@@ -117,6 +117,7 @@ public:
         if (found == nics.end()) return nullptr;
         return std::make_unique<Forwarding>(*found->second);
     }
+    int GetNetstackInstanceState(const std::string&) override { return 0; }
 
 private:
     // Hands every call to the NIC in the map, so what a change sends stays

@@ -6,7 +6,8 @@
 #include <string>
 
 #include "hostctl/Export.h"
-#include "hostctl/network/nic/Pnic.h"
+#include "hostctl/network/NetworkInfo.h"
+#include "hostctl/network/dvs/DVSwitch.h"
 #include "hostctl/network/vswitch/VirtualSwitch.h"
 
 namespace HostCtl {
@@ -22,6 +23,9 @@ public:
     // The host's network-info object (its NICs). Never throws: the host is
     // reached by the object's operations.
     static std::unique_ptr<NetworkInfo> GetNetworkInfo();
+    // The distributed switch of that name; throws HostCtlException ("no such
+    // distributed switch") when the host has none.
+    static std::unique_ptr<DVSwitch> GetDVSwitchByName(const std::string& name);
 };
 
 }  // namespace Network

@@ -7,7 +7,8 @@
 #include <vector>
 
 #include "hostctl/Export.h"
-#include "hostctl/network/nic/Pnic.h"
+#include "hostctl/network/NetworkInfo.h"
+#include "hostctl/network/ip/NetstackInstance.h"
 #include "hostctl/network/vswitch/VirtualSwitch.h"
 
 namespace PldCtl {
@@ -39,6 +40,22 @@ public:
     // for a VF id the NIC does not have (the id is never narrowed).
     virtual void GetSriovNicVFStats(HostCtl::Network::SriovNicVFStats& stats, const std::string& name,
                                     std::int64_t vfId);
+    int GetNetstackInstanceState(const std::string& key) override;
+
+    // Netstack instances. AddNetstackInstance records `instance` (a
+    // NetstackInstanceImpl made for it) on the host; `disabled` records it in
+    // the configuration only, else it is also created in the kernel. Throws
+    // for a key in use or not fit for an instance (1 to 64 letters, digits,
+    // '-', '_' or '.').
+    virtual void AddNetstackInstance(HostCtl::Network::NetstackInstance* instance, bool disabled);
+    // Throws for the default instance, a key the host does not have, and an
+    // instance that still has interfaces. `persistOnly` has no effect here.
+    virtual void RemoveNetstackInstance(const std::string& key, bool persistOnly);
+    // Null when there is none.
+    virtual std::unique_ptr<HostCtl::Network::NetstackInstance> LookupNetstackInstanceByKey(const std::string& key);
+    // In the host's order.
+    virtual std::vector<std::unique_ptr<HostCtl::Network::NetstackInstance>> ListNetstackInstances();
+
     // Every port group of every standard switch, switch by switch.
     virtual std::vector<std::unique_ptr<HostCtl::Network::PortGroup>> GetAllPortGroups();
 };

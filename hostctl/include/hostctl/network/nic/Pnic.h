@@ -327,16 +327,5 @@ public:
     virtual void RunSelfTest(SelfTestResult& result, bool online) = 0;
 };
 
-// The host's physical NICs, as the network-info object of
-// NetworkFactory::GetNetworkInfo() offers them.
-class HOSTCTL_EXPORT NetworkInfo {
-public:
-    virtual ~NetworkInfo();
-    // In the host's order.
-    virtual std::vector<std::unique_ptr<Pnic>> GetPnics() = 0;
-    // Null when the host has no NIC of that name.
-    virtual std::unique_ptr<Pnic> GetPnicByName(const std::string& name) = 0;
-};
-
 }  // namespace Network
 }  // namespace HostCtl

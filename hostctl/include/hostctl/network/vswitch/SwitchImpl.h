@@ -8,6 +8,8 @@
 #include <vector>
 
 #include "hostctl/Export.h"
+#include "hostctl/network/ConnectionPoint.h"
+#include "hostctl/network/dvs/DVSwitch.h"
 #include "hostctl/network/vswitch/VirtualSwitch.h"
 
 namespace PldCtl {
@@ -90,7 +92,8 @@ private:
 
 // A port group, found by name. Made from a name it never throws; its
 // operations throw when the host has no port group of that name.
-class HOSTCTL_EXPORT PortGroupImpl : public virtual HostCtl::Network::PortGroup {
+class HOSTCTL_EXPORT PortGroupImpl : public virtual HostCtl::Network::PortGroup,
+                                     public virtual HostCtl::Network::ConnectionPoint {
 public:
     explicit PortGroupImpl(const std::string& name);
     // A snapshot of a stored port group; a listing that counted the active
@@ -117,6 +120,15 @@ public:
     HostCtl::Network::ShapingPolicy GetOwnShapingPolicy() const override;
     void SetOwnShapingPolicy(const HostCtl::Network::ShapingPolicy& policy) override;
 
+    // As a connection point: TYPE_PORT_GROUP, its switch and its name; valid
+    // when the host has the port group.
+    int GetType() const override;
+    std::string GetPortsetName() const override;
+    std::string GetPortGroupName() const override;
+    HostCtl::Network::DVPortParam GetDVPortParam() const override;
+    HostCtl::Network::OpaqueNetworkParam GetOpaqueNetworkParam() const override;
+    bool IsValid() const override;
+
 private:
     // The stored object, read on first use.
     const Detail::PortGroupRecord& Stored() const;
@@ -137,6 +149,8 @@ public:
     virtual std::vector<std::unique_ptr<HostCtl::Network::VirtualSwitch>> GetVirtualSwitches();
     // The same switches as port sets.
     virtual std::vector<std::unique_ptr<HostCtl::Network::Portset>> GetAllSwitches();
+    // The distributed switch of that name, or null.
+    virtual std::unique_ptr<HostCtl::Network::DVSwitch> GetDVSwitchByName(const std::string& name);
     // Null when there is none.
     virtual std::unique_ptr<HostCtl::Network::VirtualSwitch> GetVirtualSwitchByName(const std::string& name);
     // Throws for a name in use or not fit for a switch, a port count outside
