@@ -34,12 +34,9 @@ public:
     // host does not have or that is in use, a netstack the host does not
     // have, a name in use, a MAC address in use or not unicast, an MTU out of
     // range, or no free port. A DV port records the connection id of `point`.
-    virtual std::unique_ptr<HostCtl::Network::PldNic> AddPalladNic(HostCtl::Network::ConnectionPoint* point,
-                                                                  const std::string& netstack,
-                                                                  const HostCtl::Network::IpConfig& config,
-                                                                  const HostCtl::Network::MacAddress& mac,
-                                                                  unsigned flags, std::int64_t mtu,
-                                                                  const std::string& name);
+    virtual std::unique_ptr<HostCtl::Network::PldNic> AddPalladNic(
+        HostCtl::Network::ConnectionPoint* point, const std::string& netstack, const HostCtl::Network::IpConfig& config,
+        const HostCtl::Network::MacAddress& mac, unsigned flags, std::int64_t mtu, const std::string& name);
     // Removes the interface connected at `point` on `netstack`; throws when
     // there is none.
     virtual void RemovePalladNic(HostCtl::Network::ConnectionPoint* point, const std::string& netstack);
@@ -53,7 +50,7 @@ public:
     // Null when there is no interface of that name. `persistedOnly` is
     // accepted for callers that pass it and has no effect here.
     virtual std::unique_ptr<HostCtl::Network::PldNic> GetPalladNicByInterface(const std::string& name,
-                                                                             bool persistedOnly);
+                                                                              bool persistedOnly);
     // Fills `names` with the names of the interfaces on that netstack.
     virtual void GetPalladNicNamesByInstanceKey(std::vector<std::string>& names, const std::string& netstack);
 };
