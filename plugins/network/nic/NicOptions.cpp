@@ -302,7 +302,8 @@ RecordPtr SoftwareSimulationRow(Pnic& pnic) {
     SoftwareSimulation simulation;
     const bool answered = NicAnswers([&] { pnic.GetSoftwareSimulation(simulation); });
     for (const SoftwareOption& entry : kSoftwareOptions) {
-        record->SetField(entry.field, answered ? OnOff(simulation.enabled[entry.feature]) : kNotAvailable);
+        record->SetField(entry.field,
+                         answered ? OnOff(simulation.enabled[static_cast<std::size_t>(entry.feature)]) : kNotAvailable);
     }
     return record;
 }
@@ -312,7 +313,7 @@ SoftwareSimulation SoftwareSimulationFromOptions(const CallSpec::Input& input) {
     for (const SoftwareOption& entry : kSoftwareOptions) {
         if (!input.IsSet(entry.option)) continue;
         simulation.mask |= SoftwareSimulation::MaskOf(entry.feature);
-        simulation.enabled[entry.feature] = input.GetBool(entry.option);
+        simulation.enabled[static_cast<std::size_t>(entry.feature)] = input.GetBool(entry.option);
     }
     return simulation;
 }
