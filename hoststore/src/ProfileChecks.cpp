@@ -286,8 +286,8 @@ const FieldChecks kInterface = {
     Flag("ipv6Dhcp"),
     Flag("ipv6RouterAdv"),
     NestedList("ipv6Addresses", kIpv6Address),
-    Words("tags", {"Management", "LiveMigration", "FaultTolerance", "Backup", "Replication", "Provisioning",
-                   "Storage", "Telemetry"}),
+    Words("tags", {"Management", "LiveMigration", "FaultTolerance", "Backup", "Replication", "Provisioning", "Storage",
+                   "Telemetry"}),
 };
 const FieldChecks kExec = {Text("command"), Integer("exitStatus", 0, 255)};
 

@@ -185,7 +185,8 @@ void NetworkInfoImpl::RemoveNetstackInstance(const std::string& key, bool) {
             throw HostCtl::Lib::HostCtlException("Netstack instance " + key + " still has interfaces: " + names);
         }
         // What lives in the instance goes with it.
-        for (const char* section : {Store::Section::kRoutes, Store::Section::kNeighbors, Store::Section::kConnections}) {
+        for (const char* section :
+             {Store::Section::kRoutes, Store::Section::kNeighbors, Store::Section::kConnections}) {
             t.RemoveChildren(section, key);
         }
         t.Remove(Detail::NetstackRecord::kSection, key);
@@ -203,7 +204,8 @@ std::unique_ptr<HostCtl::Network::NetstackInstance> NetworkInfoImpl::LookupNetst
 std::vector<std::unique_ptr<HostCtl::Network::NetstackInstance>> NetworkInfoImpl::ListNetstackInstances() {
     Store::HostStore& store = Detail::EnterOperation("NetworkInfoImpl::ListNetstackInstances");
     std::vector<std::unique_ptr<HostCtl::Network::NetstackInstance>> instances;
-    for (auto& netstack : Detail::DecodeShared<Detail::NetstackRecord>(store.ListText(Detail::NetstackRecord::kSection))) {
+    for (auto& netstack :
+         Detail::DecodeShared<Detail::NetstackRecord>(store.ListText(Detail::NetstackRecord::kSection))) {
         instances.push_back(std::make_unique<NetstackInstanceImpl>(std::move(netstack)));
     }
     return instances;

@@ -120,9 +120,9 @@ void IpConfigAccess::ToRecord(const IpConfig& config, InterfaceRecord& record) {
     record.ipv6RouterAdv = config.ipv6RouterAdvertised_;
     std::vector<Ipv6AddressRecord> addresses;
     for (const Ipv6Network& network : config.ipv6Networks_) {
-        const auto kept = std::find_if(
-            record.ipv6Addresses.begin(), record.ipv6Addresses.end(),
-            [&](const Ipv6AddressRecord& stored) { return Ipv6Network(stored.address) == network; });
+        const auto kept =
+            std::find_if(record.ipv6Addresses.begin(), record.ipv6Addresses.end(),
+                         [&](const Ipv6AddressRecord& stored) { return Ipv6Network(stored.address) == network; });
         if (kept != record.ipv6Addresses.end()) {
             addresses.push_back(*kept);
         } else {

@@ -71,9 +71,7 @@ struct NetstackRecord {
     std::int64_t CurrentMaxConnections() const {
         return currentMaxConnections ? *currentMaxConnections : (InKernel() ? maxConnections : 0);
     }
-    bool CurrentIpv6Enabled() const {
-        return currentIpv6Enabled ? *currentIpv6Enabled : (InKernel() && ipv6Enabled);
-    }
+    bool CurrentIpv6Enabled() const { return currentIpv6Enabled ? *currentIpv6Enabled : (InKernel() && ipv6Enabled); }
 };
 
 }  // namespace Detail

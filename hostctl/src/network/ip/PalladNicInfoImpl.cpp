@@ -51,6 +51,23 @@ std::vector<std::shared_ptr<const InterfaceRecord>> ListInterfaces(Store::HostSt
     return Detail::DecodeShared<InterfaceRecord>(store.ListText(InterfaceRecord::kSection));
 }
 
+// What a connection point names, read before a change: a DV port object
+// reads the host for its stored connection id, which it may not do inside
+// another read or change.
+struct PointSpec {
+    int type = 0;
+    std::string portGroup;
+    HostCtl::Network::DVPortParam dvPort;
+};
+
+PointSpec SpecOf(const ConnectionPoint& point) {
+    PointSpec spec;
+    spec.type = point.GetType();
+    if (spec.type == ConnectionPoint::TYPE_PORT_GROUP) spec.portGroup = point.GetPortGroupName();
+    if (spec.type == ConnectionPoint::TYPE_DV_PORT) spec.dvPort = point.GetDVPortParam();
+    return spec;
+}
+
 // Where a new interface's port goes, and what the interface records of it.
 struct Attachment {
     std::string portset;
@@ -85,12 +102,12 @@ Detail::StoredObject<Detail::DvPortRecord> RequireDvPort(Transaction& t, const H
 
 // Checks the connection point for a new interface and says where its port
 // goes; a DV port takes the point's connection id.
-Attachment Attach(Transaction& t, const ConnectionPoint& point,
+Attachment Attach(Transaction& t, const PointSpec& point,
                   const std::vector<std::shared_ptr<const InterfaceRecord>>& interfaces) {
     Attachment attachment;
-    switch (point.GetType()) {
+    switch (point.type) {
         case ConnectionPoint::TYPE_PORT_GROUP: {
-            const std::string name = point.GetPortGroupName();
+            const std::string& name = point.portGroup;
             std::optional<PortGroupRecord> portGroup = Detail::Get<PortGroupRecord>(t, name);
             if (!portGroup) throw HostCtlException("Port group " + name + " does not exist");
             for (const auto& nic : interfaces) {
@@ -104,7 +121,7 @@ Attachment Attach(Transaction& t, const ConnectionPoint& point,
             return attachment;
         }
         case ConnectionPoint::TYPE_DV_PORT: {
-            const HostCtl::Network::DVPortParam param = point.GetDVPortParam();
+            const HostCtl::Network::DVPortParam& param = point.dvPort;
             Detail::DvSwitchRecord dvswitch;
             Detail::StoredObject<Detail::DvPortRecord> port = RequireDvPort(t, param, dvswitch);
             for (const auto& nic : interfaces) {
@@ -170,22 +187,20 @@ MacAddress PickMac(const MacAddress& mac, const std::vector<std::shared_ptr<cons
 }
 
 // The interface connected at `point` on `netstack`, or null.
-std::shared_ptr<const InterfaceRecord> ConnectedAt(Store::Transaction& t, const ConnectionPoint& point,
+std::shared_ptr<const InterfaceRecord> ConnectedAt(Store::Transaction& t, const PointSpec& point,
                                                    const std::string& netstack) {
     std::string dvswitch;
-    const HostCtl::Network::DVPortParam param = point.GetDVPortParam();
-    if (point.GetType() == ConnectionPoint::TYPE_DV_PORT) {
+    if (point.type == ConnectionPoint::TYPE_DV_PORT) {
         for (const Detail::DvSwitchRecord& s : Detail::List<Detail::DvSwitchRecord>(t)) {
-            if (!param.switchUuid.empty() && s.uuid == param.switchUuid) dvswitch = s.name;
+            if (!point.dvPort.switchUuid.empty() && s.uuid == point.dvPort.switchUuid) dvswitch = s.name;
         }
         if (dvswitch.empty()) return nullptr;
     }
-    for (auto& nic : Detail::DecodeShared<InterfaceRecord>(t.ListText(InterfaceRecord::kSection))) {
-        if (nic->netstack != netstack) continue;
-        const bool here = point.GetType() == ConnectionPoint::TYPE_PORT_GROUP
-                              ? !nic->portgroup.empty() && nic->portgroup == point.GetPortGroupName()
-                              : point.GetType() == ConnectionPoint::TYPE_DV_PORT && nic->dvswitch == dvswitch &&
-                                    nic->dvPortId == param.portId;
+    for (auto& nic : Detail::DecodeShared<InterfaceRecord>(t.ListChildrenText(InterfaceRecord::kSection, netstack))) {
+        const bool here = point.type == ConnectionPoint::TYPE_PORT_GROUP
+                              ? !nic->portgroup.empty() && nic->portgroup == point.portGroup
+                              : point.type == ConnectionPoint::TYPE_DV_PORT && nic->dvswitch == dvswitch &&
+                                    nic->dvPortId == point.dvPort.portId;
         if (here) return nic;
     }
     return nullptr;
@@ -213,10 +228,11 @@ std::unique_ptr<PldNic> PalladNicInfoImpl::AddPalladNic(ConnectionPoint* point, 
                                                         std::int64_t mtu, const std::string& name) {
     Store::HostStore& store = Detail::EnterOperation("PalladNicInfoImpl::AddPalladNic", name);
     if (!point) throw HostCtlException("An interface needs a connection point");
+    const PointSpec spec = SpecOf(*point);
     std::shared_ptr<const InterfaceRecord> created;
     store.Change([&](Transaction& t) {
         const auto interfaces = Detail::DecodeShared<InterfaceRecord>(t.ListText(InterfaceRecord::kSection));
-        const Attachment attachment = Attach(t, *point, interfaces);
+        const Attachment attachment = Attach(t, spec, interfaces);
         if (!t.Exists(Detail::NetstackRecord::kSection, netstack)) {
             throw HostCtlException(Detail::MissingNetstackMessage(netstack));
         }
@@ -256,8 +272,9 @@ std::unique_ptr<PldNic> PalladNicInfoImpl::AddPalladNic(ConnectionPoint* point, 
 
 void PalladNicInfoImpl::RemovePalladNic(ConnectionPoint* point, const std::string& netstack) {
     Store::HostStore& store = Detail::EnterOperation("PalladNicInfoImpl::RemovePalladNic", netstack);
+    const std::optional<PointSpec> spec = point ? std::optional<PointSpec>(SpecOf(*point)) : std::nullopt;
     store.Change([&](Transaction& t) {
-        std::shared_ptr<const InterfaceRecord> nic = point ? ConnectedAt(t, *point, netstack) : nullptr;
+        std::shared_ptr<const InterfaceRecord> nic = spec ? ConnectedAt(t, *spec, netstack) : nullptr;
         if (!nic) {
             throw HostCtlException("No interface is connected to that connection point on netstack " + netstack);
         }
@@ -297,8 +314,8 @@ std::unique_ptr<PldNic> PalladNicInfoImpl::GetPalladNicByInterface(const std::st
 void PalladNicInfoImpl::GetPalladNicNamesByInstanceKey(std::vector<std::string>& names, const std::string& netstack) {
     Store::HostStore& store = Detail::EnterOperation("PalladNicInfoImpl::GetPalladNicNamesByInstanceKey", netstack);
     names.clear();
-    for (const auto& nic : InNumberOrder(Detail::DecodeShared<InterfaceRecord>(
-             store.ListChildrenText(InterfaceRecord::kSection, netstack)))) {
+    for (const auto& nic : InNumberOrder(
+             Detail::DecodeShared<InterfaceRecord>(store.ListChildrenText(InterfaceRecord::kSection, netstack)))) {
         names.push_back(nic->GetName());
     }
 }

@@ -55,8 +55,9 @@ int PldNicImpl::GetMtu() const {
 
 void PldNicImpl::SetMtu(std::int64_t mtu) {
     Detail::CheckMtu(mtu, record_->name);
-    record_ = Detail::ChangeInterface("PldNicImpl::SetMtu", record_->name,
-                                      [&](Store::Transaction&, Detail::InterfaceRecord& i) { i.mtu = static_cast<int>(mtu); });
+    record_ = Detail::ChangeInterface(
+        "PldNicImpl::SetMtu", record_->name,
+        [&](Store::Transaction&, Detail::InterfaceRecord& i) { i.mtu = static_cast<int>(mtu); });
 }
 
 int PldNicImpl::GetTsoMss() const {
