@@ -9,9 +9,10 @@
 namespace PldCtl {
 namespace Util {
 
-// Runs `command` and returns its exit status: 0 for success. The three flags
-// (wait, quiet, detach) are recorded with the run. Never throws: a host that
-// cannot run it reports a non-zero status.
+// Runs `command` and returns its exit status: 0 for success. The command and
+// its status are recorded; the three flags (wait, quiet, detach) are accepted
+// for callers that pass them and change nothing here. Never throws: a host
+// that cannot run it reports a non-zero status.
 HOSTCTL_EXPORT int PldCtl_Exec(const std::string& command, bool wait, bool quiet, bool detach);
 
 }  // namespace Util
