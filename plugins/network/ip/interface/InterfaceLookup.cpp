@@ -25,9 +25,9 @@ std::unique_ptr<HostCtl::Network::PldNic> FindListedInterface(PldCtl::Network::P
     return nullptr;
 }
 
-std::optional<PldNicList> SelectInterfaces(PldCtl::Network::PalladNicInfoImpl& interfaces, const CallSpec::Input& input,
-                                           const std::string& nameParameter, const std::string& netstackParameter,
-                                           CallSpec::Output& output) {
+std::optional<PldNicList> SelectInterfaces(PldCtl::Network::PalladNicInfoImpl& interfaces,
+                                           const CallSpec::Input& input, const std::string& nameParameter,
+                                           const std::string& netstackParameter, CallSpec::Output& output) {
     const std::string name = input.GetString(nameParameter);
     if (!name.empty()) {
         std::unique_ptr<HostCtl::Network::PldNic> one =

@@ -41,9 +41,9 @@ std::unique_ptr<HostCtl::Network::PldNic> FindListedInterface(PldCtl::Network::P
 // those of the netstack named by `netstackParameter` when that is given and
 // not empty; else all. `netstackParameter` may be "" for a listing without
 // one. Throws HostCtlException as the library does.
-std::optional<PldNicList> SelectInterfaces(PldCtl::Network::PalladNicInfoImpl& interfaces, const CallSpec::Input& input,
-                                           const std::string& nameParameter, const std::string& netstackParameter,
-                                           CallSpec::Output& output);
+std::optional<PldNicList> SelectInterfaces(PldCtl::Network::PalladNicInfoImpl& interfaces,
+                                           const CallSpec::Input& input, const std::string& nameParameter,
+                                           const std::string& netstackParameter, CallSpec::Output& output);
 
 }  // namespace NetworkNamespace
 }  // namespace OrvixCli
