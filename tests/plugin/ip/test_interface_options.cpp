@@ -1,10 +1,13 @@
 // The IP interface room's shared options at their edges: which interface
 // names the name expression lets through, the connection-point rule over
 // every combination of its three options, and how an interface created on a
-// dedicated netstack takes its tag over from the default netstack. Options
-// are parsed by the framework's real parser; the tag take-over runs against
-// a small in-memory set of interfaces.
+// dedicated netstack takes its tag over from the default netstack; then the
+// connection points made on a fresh default host, where a DV port's
+// connection id is the time. Options are parsed by the framework's real
+// parser; the tag take-over runs against a small in-memory set of interfaces.
 #include <algorithm>
+#include <cstdint>
+#include <ctime>
 #include <map>
 #include <memory>
 #include <stdexcept>
@@ -15,6 +18,8 @@
 #include <gtest/gtest.h>
 
 #include "framework/Runner.h"
+#include "hostctl/HostFixture.h"
+#include "ip/interface/IpInterfaceAdd.h"
 #include "ip/interface/InterfaceOptions.h"
 
 namespace {
@@ -197,6 +202,93 @@ TEST(AutoTagInterfaceOnDedicatedStack, TakesTheTagFromTheDefaultNetstackOnly) {
     EXPECT_EQ(host.interfaces["pld5"].tags, (std::vector<PldNicTagType>{migration}));
     // The new interface is tagged for good, not only in the stored configuration.
     EXPECT_EQ(host.addTagCalls, (std::vector<std::pair<std::string, bool>>{{"pld5", false}}));
+}
+
+
+// Against a fresh copy of the default host, whose dvSwitch0 has the DV port
+// 10 (in use by pld1, connection id 1717243002) and the free ports 11 and
+// 22, never connected to (connection id 0).
+class ConnectionPoints : public FreshHost {
+protected:
+    // The connection point the options name, and what was reported.
+    std::pair<std::unique_ptr<HostCtl::Network::ConnectionPoint>, Names> Make(const Names& args) {
+        boost::shared_ptr<CallSpec::InputSpec> declared = CallSpec::InputSpec::New();
+        DeclareConnectionPointParameters(declared, "");
+        boost::shared_ptr<CallSpec::Output> output = CallSpec::Output::New();
+        auto point = MakeConnectionPoint(*AutoCli::ParseArguments(*declared, args), *output);
+        return {std::move(point), output->GetErrors()};
+    }
+
+    static std::uint32_t Now() { return static_cast<std::uint32_t>(std::time(nullptr)); }
+};
+
+TEST_F(ConnectionPoints, ANeverConnectedDVPortGetsTheCurrentTimeAsItsConnectionId) {
+    const std::uint32_t before = Now();
+    auto [point, errors] = Make({"-s", "dvSwitch0", "-P", "11"});
+    const std::uint32_t after = Now();
+    ASSERT_TRUE(point);
+    EXPECT_TRUE(errors.empty());
+    EXPECT_EQ(point->GetType(), HostCtl::Network::ConnectionPoint::TYPE_DV_PORT);
+    const HostCtl::Network::DVPortParam param = point->GetDVPortParam();
+    EXPECT_EQ(param.switchUuid, NetworkFactory::GetDVSwitchByName("dvSwitch0")->GetUUID());
+    EXPECT_EQ(param.portId, "11");
+    EXPECT_GE(param.connectionId, before);
+    EXPECT_LE(param.connectionId, after);
+    // Making the point records nothing: the port is connected only when an
+    // interface is added on it.
+    EXPECT_EQ(Stored("dvports", "id", "11").value("connectionId", -1), 0);
+}
+
+TEST_F(ConnectionPoints, AConnectedDVPortKeepsItsConnectionId) {
+    auto [point, errors] = Make({"-s", "dvSwitch0", "-P", "10"});
+    ASSERT_TRUE(point);
+    EXPECT_TRUE(errors.empty());
+    EXPECT_EQ(point->GetDVPortParam().connectionId, 1717243002u);
+}
+
+TEST_F(ConnectionPoints, AddingOnANeverConnectedDVPortStoresTheTime) {
+    IpInterfaceAdd add;
+    boost::shared_ptr<CallSpec::Output> output = CallSpec::Output::New();
+    const std::uint32_t before = Now();
+    add.Execute(AutoCli::ParseArguments(*add.GetInputSpec(), {"-s", "dvSwitch0", "-P", "22", "-i", "pld9"}),
+                output);
+    const std::uint32_t after = Now();
+    ASSERT_EQ(output->GetErrors(), Names{});
+    const Json stored = Stored("dvports", "id", "22");
+    ASSERT_TRUE(stored.is_object());
+    EXPECT_GE(stored.value("connectionId", 0u), before);
+    EXPECT_LE(stored.value("connectionId", 0u), after);
+    EXPECT_EQ(Stored("interfaces", "name", "pld9").value("dvPortId", ""), "22");
+}
+
+TEST_F(ConnectionPoints, ThePortGroupIsNamedExactly) {
+    auto [point, errors] = Make({"-p", "VM Network"});
+    ASSERT_TRUE(point);
+    EXPECT_TRUE(errors.empty());
+    EXPECT_EQ(point->GetType(), HostCtl::Network::ConnectionPoint::TYPE_PORT_GROUP);
+    EXPECT_EQ(point->GetPortGroupName(), "VM Network");
+    EXPECT_EQ(point->GetPortsetName(), "vSwitch0");
+
+    auto [other, otherErrors] = Make({"-p", "vm network"});
+    EXPECT_FALSE(other);
+    EXPECT_EQ(otherErrors, Names{"Invalid vswitch port group or DVPort parameters."});
+}
+
+// The MTU reaches the library whole, also past what the framework lets
+// through: a value past 32 bits is refused, never cut down to one that fits.
+TEST_F(ConnectionPoints, AnMtuIsNeverNarrowed) {
+    const std::int64_t mtu = (std::int64_t{1} << 32) + 1500;
+    IpInterfaceAdd add;
+    boost::shared_ptr<CallSpec::Input> input = CallSpec::Input::New();
+    input->SetString("portgroup-name", "VM Network");
+    input->SetString("interface-name", "pld9");
+    input->SetInt("mtu", std::to_string(mtu), mtu);
+    boost::shared_ptr<CallSpec::Output> output = CallSpec::Output::New();
+    add.Execute(input, output);
+    EXPECT_EQ(output->GetErrors(),
+              Names{"Unable to add Pallad network interface. Error was : Invalid MTU value 4294968796 for interface "
+                    "pld9: must be between 1280 and 9000"});
+    EXPECT_TRUE(Stored("interfaces", "name", "pld9").is_null());
 }
 
 }  // namespace

@@ -80,3 +80,5 @@ $ orvixcli network ip interface remove -i pld0
 $ orvixcli network ip interface add -p Spare -i pld0
 
 $ orvixcli network ip interface list --formatter=csv
+
+$ orvixcli network ip interface add --help

@@ -69,3 +69,6 @@ $ orvixcli network ip interface tag get -i pld2 --formatter=json
 $ orvixcli network ip interface tag add -i pld0
 
 $ orvixcli network ip interface tag get
+
+## The supported tags are listed in the help of tag add.
+$ orvixcli network ip interface tag add --help
