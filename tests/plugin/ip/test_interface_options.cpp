@@ -19,8 +19,8 @@
 
 #include "framework/Runner.h"
 #include "hostctl/HostFixture.h"
-#include "ip/interface/IpInterfaceAdd.h"
 #include "ip/interface/InterfaceOptions.h"
+#include "ip/interface/IpInterfaceAdd.h"
 
 namespace {
 
@@ -119,6 +119,8 @@ struct FakeHost {
     };
     std::map<std::string, Interface> interfaces;
     std::vector<std::pair<std::string, bool>> addTagCalls;
+    // The interface whose RemoveTag the host refuses.
+    std::string refusesRemoveTag;
 };
 
 class FakeNic : public HostCtl::Network::PldNic {
@@ -134,6 +136,7 @@ public:
         if (std::find(tags.begin(), tags.end(), tag) == tags.end()) tags.push_back(tag);
     }
     void RemoveTag(PldNicTagType tag) override {
+        if (name_ == host_.refusesRemoveTag) throw HostCtl::Lib::HostCtlException("Tags of " + name_ + " are locked");
         auto& tags = host_.interfaces.at(name_).tags;
         tags.erase(std::remove(tags.begin(), tags.end(), tag), tags.end());
     }
@@ -204,6 +207,30 @@ TEST(AutoTagInterfaceOnDedicatedStack, TakesTheTagFromTheDefaultNetstackOnly) {
     EXPECT_EQ(host.addTagCalls, (std::vector<std::pair<std::string, bool>>{{"pld5", false}}));
 }
 
+// A take-over the host stops halfway gives the tag back to the interfaces
+// it was already taken from, and passes the failure on.
+TEST(AutoTagInterfaceOnDedicatedStack, GivesTheTagBackWhenTheTakeOverStops) {
+    const PldNicTagType migration = HostCtl::Network::PLDNIC_TAG_LIVE_MIGRATION;
+    FakeHost host;
+    host.interfaces = {
+        {"pld0", {"defaultTcpipStack", {migration}}},
+        {"pld1", {"defaultTcpipStack", {migration}}},
+        {"pld2", {"defaultTcpipStack", {migration}}},
+        {"pld5", {"migrix", {}}},
+    };
+    host.refusesRemoveTag = "pld1";
+    FakeInterfaces interfaces(host);
+    FakeNic created(host, "pld5");
+    try {
+        AutoTagInterfaceOnDedicatedStack(interfaces, created, migration);
+        ADD_FAILURE() << "the refusal was not passed on";
+    } catch (const HostCtl::Lib::HostCtlException& e) {
+        EXPECT_EQ(e.GetMessage(0), "Tags of pld1 are locked");
+    }
+    for (const char* name : {"pld0", "pld1", "pld2"}) {
+        EXPECT_EQ(host.interfaces[name].tags, (std::vector<PldNicTagType>{migration})) << name;
+    }
+}
 
 // Against a fresh copy of the default host, whose dvSwitch0 has the DV port
 // 10 (in use by pld1, connection id 1717243002) and the free ports 11 and
@@ -250,8 +277,7 @@ TEST_F(ConnectionPoints, AddingOnANeverConnectedDVPortStoresTheTime) {
     IpInterfaceAdd add;
     boost::shared_ptr<CallSpec::Output> output = CallSpec::Output::New();
     const std::uint32_t before = Now();
-    add.Execute(AutoCli::ParseArguments(*add.GetInputSpec(), {"-s", "dvSwitch0", "-P", "22", "-i", "pld9"}),
-                output);
+    add.Execute(AutoCli::ParseArguments(*add.GetInputSpec(), {"-s", "dvSwitch0", "-P", "22", "-i", "pld9"}), output);
     const std::uint32_t after = Now();
     ASSERT_EQ(output->GetErrors(), Names{});
     const Json stored = Stored("dvports", "id", "22");

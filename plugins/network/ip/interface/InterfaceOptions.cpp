@@ -164,8 +164,25 @@ std::unique_ptr<HostCtl::Network::ConnectionPoint> MakeConnectionPoint(const Cal
 void AutoTagInterfaceOnDedicatedStack(PldCtl::Network::PalladNicInfoImpl& interfaces, HostCtl::Network::PldNic& nic,
                                       PldNicTagType tag) {
     nic.AddTag(tag, false);
-    for (const auto& tagged : interfaces.GetPalladNicsByTag(tag)) {
-        if (tagged->GetNetstackInstance() == DEFAULT_NETSTACK) tagged->RemoveTag(tag);
+    std::vector<HostCtl::Network::PldNic*> untagged;
+    const std::vector<std::unique_ptr<HostCtl::Network::PldNic>> tagged = interfaces.GetPalladNicsByTag(tag);
+    try {
+        for (const auto& holder : tagged) {
+            if (holder->GetNetstackInstance() != DEFAULT_NETSTACK) continue;
+            holder->RemoveTag(tag);
+            untagged.push_back(holder.get());
+        }
+    } catch (const HostCtl::Lib::HostCtlException&) {
+        // A take-over that stops halfway is undone as far as the host lets
+        // it, so that no default-stack interface is left without its tag
+        // by a change that is reported as failed.
+        for (HostCtl::Network::PldNic* holder : untagged) {
+            try {
+                holder->AddTag(tag, false);
+            } catch (const HostCtl::Lib::HostCtlException&) {
+            }
+        }
+        throw;
     }
 }
 

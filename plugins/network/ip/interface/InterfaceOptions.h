@@ -70,7 +70,8 @@ std::unique_ptr<HostCtl::Network::ConnectionPoint> MakeConnectionPoint(const Cal
 // Gives `nic`, just created on a dedicated netstack, that netstack's `tag`,
 // and takes the tag from every interface on the default netstack that has
 // it: the dedicated netstack takes the traffic over. Interfaces on other
-// netstacks keep the tag. Throws HostCtlException as the library does.
+// netstacks keep the tag. Throws HostCtlException as the library does,
+// after giving the tag back to the interfaces it had already taken it from.
 void AutoTagInterfaceOnDedicatedStack(PldCtl::Network::PalladNicInfoImpl& interfaces, HostCtl::Network::PldNic& nic,
                                       HostCtl::Network::PldNicTagType tag);
 

@@ -6,6 +6,7 @@
 #include <string>
 
 #include "common/CommandSupport.h"
+#include "hostctl/Lib.h"
 #include "hostctl/Values.h"
 #include "hostctl/network/ip/IpConfig.h"
 #include "hostctl/network/ip/PalladNicInfoImpl.h"
@@ -57,6 +58,22 @@ std::optional<HostCtl::Network::MacAddress> MacAddressOption(const CallSpec::Inp
     return HostCtl::Network::MacAddress(text);
 }
 
+// Tags an interface just made on a dedicated netstack. When that fails the
+// interface is removed again, so that a failure reported for the command
+// leaves no interface behind; the failure itself is passed on.
+void TagOrUndo(PldCtl::Network::PalladNicInfoImpl& interfaces, HostCtl::Network::PldNic& nic,
+               HostCtl::Network::PldNicTagType tag) {
+    try {
+        AutoTagInterfaceOnDedicatedStack(interfaces, nic, tag);
+    } catch (const HostCtl::Lib::HostCtlException&) {
+        try {
+            nic.Remove();
+        } catch (const HostCtl::Lib::HostCtlException&) {
+        }
+        throw;
+    }
+}
+
 }  // namespace
 
 void IpInterfaceAdd::ExecuteInternal(boost::shared_ptr<CallSpec::Input> input,
@@ -77,7 +94,7 @@ void IpInterfaceAdd::ExecuteInternal(boost::shared_ptr<CallSpec::Input> input,
                 interfaces.AddPalladNic(point.get(), netstack, HostCtl::Network::IpConfig(), *mac, 0, mtu, name);
             const std::optional<DedicatedNetstack> dedicated = DedicatedNetstackByKey(netstack);
             if (nic && dedicated) {
-                AutoTagInterfaceOnDedicatedStack(interfaces, *nic, dedicated->tag);
+                TagOrUndo(interfaces, *nic, dedicated->tag);
                 // The interface stays even when the daemon does not come
                 // back: the failure is the daemon's, reported beside success.
                 if (dedicated->restartsRfxDaemon &&
