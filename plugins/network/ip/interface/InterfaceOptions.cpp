@@ -84,6 +84,11 @@ void DeclareNetstackParameter(const boost::shared_ptr<CallSpec::InputSpec>& inpu
                      "The network stack instance; if unspecified, use the default netstack instance", Required::No);
 }
 
+std::string NetstackOption(const CallSpec::Input& input) {
+    const std::string given = input.GetString("netstack");
+    return given.empty() ? std::string(DEFAULT_NETSTACK) : given;
+}
+
 bool CheckConnectionPointChoice(const CallSpec::Input& input, CallSpec::Output& output) {
     const bool portGroup = input.IsSet("portgroup-name");
     const bool dvSwitch = input.IsSet("dvs-name");

@@ -60,8 +60,7 @@ void RemoveByConnectionPoint(PldCtl::Network::PalladNicInfoImpl& interfaces, con
     if (!CheckConnectionPointChoice(input, *output)) return;
     std::unique_ptr<HostCtl::Network::ConnectionPoint> point = MakeConnectionPoint(input, *output);
     if (!point) return;
-    const std::string given = input.GetString("netstack");
-    interfaces.RemovePalladNic(point.get(), given.empty() ? std::string(DEFAULT_NETSTACK) : given);
+    interfaces.RemovePalladNic(point.get(), NetstackOption(input));
     FinishTrue(output);
 }
 

@@ -320,6 +320,19 @@ pld6,02:a1:01:00:00:08,true,dvSwitch1,N/A,defaultTcpipStack,dvSwitch1,50 3c 8e 1
 pld7,02:a1:01:00:00:07,true,N/A,N/A,N/A,N/A,N/A,N/A,-1,N/A,N/A,N/A,1500,65535,0
 pld255,02:a1:01:00:00:ff,true,vSwitch0,Spare,defaultTcpipStack,N/A,N/A,N/A,-1,N/A,N/A,N/A,9000,65535,33554437
 
+## An empty netstack is the default one.
+$ orvixcli network ip interface add -s dvSwitch1 -P 0 -N ""
+
+$ orvixcli network ip interface list -N defaultTcpipStack --formatter=csv
+Name,MAC Address,Enabled,Portset,Portgroup,Netstack Instance,VDS Name,VDS UUID,VDS Port,VDS Connection,Opaque Network ID,Opaque Network Type,External ID,MTU,TSO MSS,Port ID
+pld0,02:a1:01:00:00:01,true,vSwitch0,Management Network,defaultTcpipStack,N/A,N/A,N/A,-1,N/A,N/A,N/A,1500,65535,33554438
+pld1,02:a1:01:00:00:02,true,dvSwitch1,N/A,defaultTcpipStack,dvSwitch1,50 3c 8e 1a 44 0b 7d 2e-9f 61 a2 c4 05 d7 3b 18,5,1700000005,N/A,N/A,N/A,9000,65535,67108866
+pld4,02:a1:01:00:00:05,true,N/A,N/A,N/A,N/A,N/A,N/A,-1,N/A,N/A,N/A,1500,1460,0
+pld5,02:a1:01:00:00:06,true,ovSwitch0,N/A,defaultTcpipStack,N/A,N/A,N/A,-1,seg-7f3a,overlay,ext-0042,1500,65535,83886082
+pld6,02:a1:01:00:00:08,true,dvSwitch1,N/A,defaultTcpipStack,dvSwitch1,50 3c 8e 1a 44 0b 7d 2e-9f 61 a2 c4 05 d7 3b 18,6,1700000006,N/A,N/A,N/A,1500,65535,67108867
+pld8,02:a1:01:00:00:09,true,dvSwitch1,N/A,defaultTcpipStack,dvSwitch1,50 3c 8e 1a 44 0b 7d 2e-9f 61 a2 c4 05 d7 3b 18,0,1700000000,N/A,N/A,N/A,1500,65535,67108868
+pld255,02:a1:01:00:00:ff,true,vSwitch0,Spare,defaultTcpipStack,N/A,N/A,N/A,-1,N/A,N/A,N/A,9000,65535,33554437
+
 $ orvixcli network ip interface add --help
 Usage: orvixcli network ip interface add [cmd options]
 

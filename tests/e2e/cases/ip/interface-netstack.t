@@ -34,7 +34,7 @@ $ orvixcli network ip interface tag get -i pld3 --formatter=json
   ]
 }
 
-## The netstack name is compared exactly: Migrix is no dedicated netstack.
+## Netstack names are compared exactly: the host has no Migrix.
 $ orvixcli network ip interface add -s dvSwitch1 -P 6 -N Migrix
 ! Unable to add Pallad network interface. Error was : Netstack instance Migrix does not exist
 [1]
