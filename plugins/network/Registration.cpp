@@ -12,6 +12,13 @@
 #include "framework/AutoCli.h"
 #include "ip/IpGet.h"
 #include "ip/IpSet.h"
+#include "ip/interface/IpInterfaceAdd.h"
+#include "ip/interface/IpInterfaceList.h"
+#include "ip/interface/IpInterfaceRemove.h"
+#include "ip/interface/IpInterfaceSet.h"
+#include "ip/interface/IpInterfaceTagAdd.h"
+#include "ip/interface/IpInterfaceTagGet.h"
+#include "ip/interface/IpInterfaceTagRemove.h"
 #include "nic/NicCoalesceGet.h"
 #include "nic/NicCoalesceSet.h"
 #include "nic/NicCsoGet.h"
@@ -171,10 +178,10 @@ extern "C" __attribute__((visibility("default"))) void AutoCli_RegisterNamespace
     // list: IpIpsecSPList
 
     // network ip interface
-    // add: IpInterfaceAdd
-    // remove: IpInterfaceRemove
-    // list: IpInterfaceList
-    // set: IpInterfaceSet
+    ipInterface->RegisterNamespaceNode(IpInterfaceAdd::New(), "add");
+    ipInterface->RegisterNamespaceNode(IpInterfaceRemove::New(), "remove");
+    ipInterface->RegisterNamespaceNode(IpInterfaceList::New(), "list");
+    ipInterface->RegisterNamespaceNode(IpInterfaceSet::New(), "set");
     auto ipInterfaceIpv4 = Attach(ipInterface, "ipv4", "Commands to get and set IPv4 settings for pldnic.");
     auto ipInterfaceIpv6 = Attach(ipInterface, "ipv6", "Commands to get and set IPv6 settings for pldnic.");
     auto ipInterfaceTag = Attach(ipInterface, "tag", "Commands to add and remove tags on pldnics.");
@@ -195,9 +202,9 @@ extern "C" __attribute__((visibility("default"))) void AutoCli_RegisterNamespace
     // remove: IpInterfaceIpv6AddressRemove
 
     // network ip interface tag
-    // add: IpInterfaceTagAdd
-    // remove: IpInterfaceTagRemove
-    // get: IpInterfaceTagGet
+    ipInterfaceTag->RegisterNamespaceNode(IpInterfaceTagAdd::New(), "add");
+    ipInterfaceTag->RegisterNamespaceNode(IpInterfaceTagRemove::New(), "remove");
+    ipInterfaceTag->RegisterNamespaceNode(IpInterfaceTagGet::New(), "get");
 
     // network ip netstack
     // list: IpNetstackInstanceList
