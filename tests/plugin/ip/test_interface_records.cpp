@@ -1,7 +1,9 @@
 // How an addressing change reaches an interface held in memory: what is
 // written back, the DNS-from-DHCP flag in force above all, which the
-// interface's configuration does not carry. (The rows the getters show are
-// pinned by the transcripts.)
+// interface's configuration does not carry. Then the commands in-process
+// against a fresh copy of the default host, for how a run ends, which the
+// transcripts cannot see. (The rows the getters show are pinned by the
+// transcripts.)
 #include <memory>
 #include <stdexcept>
 #include <string>
@@ -9,9 +11,16 @@
 
 #include <gtest/gtest.h>
 
+#include "framework/Runner.h"
+#include "hostctl/HostSession.h"
 #include "hostctl/Lib.h"
 #include "hostctl/Values.h"
 #include "ip/interface/InterfaceRecords.h"
+#include "ip/interface/IpInterfaceIpv4Get.h"
+#include "ip/interface/IpInterfaceIpv4Set.h"
+#include "ip/interface/IpInterfaceIpv6AddressAdd.h"
+#include "ip/interface/IpInterfaceIpv6Set.h"
+#include "support/test_util.h"
 
 namespace {
 
@@ -102,6 +111,68 @@ TEST(RewriteIpConfig, AnEditThatFailsWritesNothing) {
                                  }),
                  HostCtl::Lib::HostCtlException);
     EXPECT_TRUE(nic.written.empty());
+}
+
+// Parsed by the framework's parser from the command's own declaration.
+boost::shared_ptr<CallSpec::Output> RunCommand(AutoCli::Command& command, const std::vector<std::string>& args) {
+    boost::shared_ptr<CallSpec::Output> output = CallSpec::Output::New();
+    command.Execute(AutoCli::ParseArguments(*command.GetInputSpec(), args), output);
+    return output;
+}
+
+class AddressingRuns : public ::testing::Test {
+protected:
+    AddressingRuns() : db_("ORVIX_HOST_DB", dir_ / "host.db"), profile_("ORVIX_HOST_PROFILE", std::nullopt) {
+        PldCtl::Lib::ReopenHost();
+    }
+    ~AddressingRuns() override { PldCtl::Lib::ReopenHost(); }
+
+    static std::unique_ptr<HostCtl::Network::PldNic> Interface(const std::string& name) {
+        PldCtl::Network::PalladNicInfoImpl interfaces;
+        auto nic = interfaces.GetPalladNicByInterface(name, false);
+        if (!nic) throw std::logic_error("no interface " + name);
+        return nic;
+    }
+
+    OrvixTest::TempDir dir_;
+    OrvixTest::ScopedEnv db_;
+    OrvixTest::ScopedEnv profile_;
+};
+
+TEST_F(AddressingRuns, ARefusedRunEndsWithItsMessagesAloneAndADoneOneWithOneComplete) {
+    auto ipv4Set = IpInterfaceIpv4Set::New();
+    auto unchecked = RunCommand(*ipv4Set, {"-i", "pld0", "-t", "static", "-I", "192.0.2.99"});
+    EXPECT_EQ(
+        unchecked->GetErrors(),
+        (std::vector<std::string>{"The --type=static requires the --ipv4 and --netmask options.",
+                                  "Invalid --netmask option provided. This address is not a valid IPv4 address"}));
+    EXPECT_FALSE(unchecked->GetResult());
+    EXPECT_EQ(unchecked->CompleteCalls(), 0);
+    EXPECT_EQ(Interface("pld0")->GetIpConfig().GetIpv4Address().GetStringAddress(), "192.0.2.21");
+
+    auto add = IpInterfaceIpv6AddressAdd::New();
+    auto badText = RunCommand(*add, {"-i", "pld9", "-I", "2001:db8::1"});
+    EXPECT_EQ(badText->GetErrors().size(), 1u);
+    EXPECT_EQ(badText->GetErrors()[0].rfind("Invalid format for IPv6 address.", 0), 0u);
+    EXPECT_FALSE(badText->GetResult());
+    EXPECT_EQ(badText->CompleteCalls(), 0);
+
+    auto ipv4Get = IpInterfaceIpv4Get::New();
+    auto missing = RunCommand(*ipv4Get, {"-i", "pld9", "-N", "migrix"});
+    EXPECT_EQ(missing->GetErrors(), std::vector<std::string>{"Unable to find a Pallad interface with the name pld9"});
+    EXPECT_FALSE(missing->GetResult());
+    EXPECT_EQ(missing->CompleteCalls(), 0);
+
+    // pld1 uses DNS from DHCP; turning DHCPv6 off keeps that.
+    auto ipv6Set = IpInterfaceIpv6Set::New();
+    auto done = RunCommand(*ipv6Set, {"-i", "pld1", "-d", "false"});
+    EXPECT_TRUE(done->GetErrors().empty());
+    auto result = boost::dynamic_pointer_cast<MetaObj::MetaBool>(done->GetResult());
+    ASSERT_TRUE(result);
+    EXPECT_TRUE(result->GetValue());
+    EXPECT_EQ(done->CompleteCalls(), 1);
+    EXPECT_FALSE(Interface("pld1")->GetIpConfig().GetUseIpv6Dhcp());
+    EXPECT_TRUE(Interface("pld1")->GetDnsConfig().GetDhcpDns());
 }
 
 }  // namespace
