@@ -113,6 +113,17 @@ TEST(RewriteIpConfig, AnEditThatFailsWritesNothing) {
     EXPECT_TRUE(nic.written.empty());
 }
 
+// The host stores only the named types and states, so a listing never
+// reaches the fallbacks; the words must still not invent a type.
+TEST(Ipv6AddressWords, ATypeWithoutAWordShowsNothingAndAnyOtherStatusIsPreferred) {
+    for (int type : {-1, 1, 4, 8, 10}) EXPECT_EQ(Ipv6AddressTypeWord(type), "") << type;
+    EXPECT_EQ(Ipv6AddressTypeWord(Ipv6Network::TYPE_DHCP), "DHCP");
+    for (int status : {-1, Ipv6Network::STATUS_PREFERRED, 1, 4, 6}) {
+        EXPECT_EQ(Ipv6AddressStatusWord(status), "PREFERRED") << status;
+    }
+    EXPECT_EQ(Ipv6AddressStatusWord(Ipv6Network::STATUS_DUPLICATED), "DUPLICATED");
+}
+
 // Parsed by the framework's parser from the command's own declaration.
 boost::shared_ptr<CallSpec::Output> RunCommand(AutoCli::Command& command, const std::vector<std::string>& args) {
     boost::shared_ptr<CallSpec::Output> output = CallSpec::Output::New();
