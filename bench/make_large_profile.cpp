@@ -1,6 +1,6 @@
 // Writes a large host profile on stdout, for the benchmark: about 1000
 // standard switches with 4096 ports in all, 2000 port groups, 256 kernel
-// interfaces, 10000 routes and 64 NICs with their driver data.
+// interfaces over 16 netstacks, 10000 routes and 64 NICs with their driver data.
 // Deterministic: the same profile every time.
 #include <cstdint>
 #include <cstdio>
@@ -17,6 +17,7 @@ constexpr int kSwitches = 1000;
 constexpr int kPorts = 4096;
 constexpr int kPortGroupsPerSwitch = 2;
 constexpr int kInterfaces = 256;
+constexpr int kNetstacks = 16;
 constexpr int kRoutes = 10000;
 constexpr int kNics = 64;
 constexpr long long kPortBlock = 1LL << 24;
@@ -192,11 +193,21 @@ int main() {
         }
     }
 
+    // The interfaces take the netstacks in turn, pld0 (which the routes use)
+    // the default one, and each has a static address; every fourth netstack
+    // is in the configuration only.
+    Json netstacks = Json::array({{{"key", "defaultTcpipStack"}, {"name", "defaultTcpipStack"}, {"state", 4660}}});
+    for (int n = 1; n < kNetstacks; ++n) {
+        netstacks.push_back({{"key", "stack" + std::to_string(n)}, {"state", n % 4 == 0 ? 2 : 4660}});
+    }
     Json interfaces = Json::array();
     for (int i = 0; i < kInterfaces; ++i) {
         const std::string sw = "vSwitch" + std::to_string(i);
         interfaces.push_back({{"name", "pld" + std::to_string(i)},
-                              {"netstack", "defaultTcpipStack"},
+                              {"netstack", netstacks[static_cast<std::size_t>(i % kNetstacks)]["key"]},
+                              {"ipv4Mode", "static"},
+                              {"ipv4Address", "198.51.100." + std::to_string(i % 254 + 1)},
+                              {"ipv4Netmask", "255.255.255.0"},
                               {"mac", Mac(0xb0, i)},
                               {"mtu", 1500},
                               {"enabled", true},
@@ -227,8 +238,7 @@ int main() {
     profile["nics"] = nics;
     profile["vswitches"] = vswitches;
     profile["portgroups"] = portgroups;
-    profile["netstacks"] =
-        Json::array({{{"key", "defaultTcpipStack"}, {"name", "defaultTcpipStack"}, {"state", 4660}}});
+    profile["netstacks"] = netstacks;
     profile["interfaces"] = interfaces;
     profile["routes"] = routes;
     profile["ports"] = ports;

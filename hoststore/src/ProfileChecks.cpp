@@ -33,7 +33,7 @@ using FieldChecks = std::vector<FieldCheck>;
 // written with a fraction or an exponent counts as that integer, as the
 // library reads it so.
 struct FieldCheck {
-    enum class Kind { String, Bool, Integer, Word, StringList, IntegerList, Object, ObjectList, HexBytes };
+    enum class Kind { String, Bool, Integer, Word, StringList, WordList, IntegerList, Object, ObjectList, HexBytes };
 
     const char* name;
     Kind kind;
@@ -57,6 +57,9 @@ FieldCheck Integer(const char* name, std::int64_t min, std::uint64_t max) {
 }
 FieldCheck Word(const char* name, std::initializer_list<const char*> words) {
     return {name, FieldCheck::Kind::Word, 0, 0, words};
+}
+FieldCheck Words(const char* name, std::initializer_list<const char*> words) {
+    return {name, FieldCheck::Kind::WordList, 0, 0, words};
 }
 FieldCheck Nested(const char* name, const FieldChecks& fields) {
     return {name, FieldCheck::Kind::Object, 0, 0, {}, &fields};
@@ -118,6 +121,7 @@ const FieldChecks kPortGroup = {
 };
 const FieldChecks kDvSwitch = {
     Text("name"),
+    Text("uuid"),
     Integer("numPorts", kMinSwitchPorts, kMaxSwitchPorts),
     Names("uplinks"),
 };
@@ -131,6 +135,7 @@ const FieldChecks kPort = {
     Word("type", {"vm", "kernel", "uplink", "internal"}),
     Text("client"),
     Text("portgroup"),
+    Text("dvPortId"),
     Flag("vlanStatsEnabled"),
     NestedList("vlanStats", kVlanStats),
 };
@@ -241,7 +246,50 @@ const FieldChecks kNic = {
 const FieldChecks kSystem = {
     Flag("ipv6Enabled"),
     Integer("maxPorts", 1, kInt64Max),
+    Names("congestionControlAlgorithms"),
 };
+const FieldChecks kDvPort = {Text("dvswitch"), Text("id"), Integer("connectionId", 0, kUint32Max)};
+const FieldChecks kNetstack = {
+    Text("key"),
+    Text("name"),
+    Integer("state", 0, kInt32Max),
+    Integer("maxConnections", 1, kInt32Max),
+    Integer("currentMaxConnections", 0, kInt32Max),
+    Text("ccAlgorithm"),
+    Flag("ipv6Enabled"),
+    Flag("currentIpv6Enabled"),
+};
+const FieldChecks kIpv6Address = {
+    Text("address"),
+    Word("type", {"static", "autoconf", "dhcp"}),
+    Word("status", {"preferred", "tentative", "duplicated", "deprecated"}),
+};
+const FieldChecks kInterface = {
+    Text("name"),
+    Text("netstack"),
+    Text("portgroup"),
+    Text("dvswitch"),
+    Text("dvPortId"),
+    Text("opaqueNetworkId"),
+    Text("opaqueNetworkType"),
+    Text("externalId"),
+    Text("opaqueSwitch"),
+    Integer("portId", 0, kInt64Max),
+    Text("mac"),
+    Integer("mtu", 1280, 9000),
+    Integer("tsoMss", 0, kInt32Max),
+    Flag("enabled"),
+    Word("ipv4Mode", {"static", "dhcp", "none"}),
+    Text("ipv4Address"),
+    Text("ipv4Netmask"),
+    Flag("dhcpDns"),
+    Flag("ipv6Dhcp"),
+    Flag("ipv6RouterAdv"),
+    NestedList("ipv6Addresses", kIpv6Address),
+    Words("tags", {"Management", "LiveMigration", "FaultTolerance", "Backup", "Replication", "Provisioning", "Storage",
+                   "Telemetry"}),
+};
+const FieldChecks kExec = {Text("command"), Integer("exitStatus", 0, 255)};
 
 const FieldChecks* ChecksOf(const std::string& section) {
     static const std::vector<std::pair<const char*, const FieldChecks*>> sections = {
@@ -251,6 +299,10 @@ const FieldChecks* ChecksOf(const std::string& section) {
         {Section::kPorts, &kPort},
         {Section::kNics, &kNic},
         {Section::kSystem, &kSystem},
+        {Section::kDvPorts, &kDvPort},
+        {Section::kNetstacks, &kNetstack},
+        {Section::kInterfaces, &kInterface},
+        {Section::kExecLog, &kExec},
     };
     for (const auto& [name, checks] : sections) {
         if (section == name) return checks;
@@ -279,6 +331,34 @@ std::string Range(const FieldCheck& check) {
     return "an integer from " + std::to_string(check.min) + " to " + std::to_string(check.max);
 }
 
+// Why the value is none of the check's words; empty when it is one.
+std::string WordMismatch(const FieldCheck& check, const Json& value, const std::string& found) {
+    std::string list;
+    for (const char* word : check.words) {
+        if (value.is_string() && value.get<std::string>() == word) return "";
+        list += (list.empty() ? "" : ", ") + std::string(word);
+    }
+    return "must be one of " + list + (value.is_string() ? ", not '" + value.get<std::string>() + "'" : found);
+}
+
+// The store joins the key fields of some collections with '|' into one key
+// (dvports: switch and port id). A '|' inside one of them could make two
+// objects' keys the same ("a|b" + "c" and "a" + "b|c"), so it is refused.
+void CheckJoinedKey(const std::string& section, const Json& object, const std::string& where) {
+    const CollectionInfo* collection = nullptr;
+    for (const CollectionInfo& c : Collections()) {
+        if (section == c.section) collection = &c;
+    }
+    if (!collection || collection->keyFields.size() < 2) return;
+    for (const char* field : collection->keyFields) {
+        const auto value = object.find(field);
+        if (value != object.end() && value->is_string() &&
+            value->get_ref<const std::string&>().find('|') != std::string::npos) {
+            throw ProfileError(where + "." + field + ": must not contain '|', which joins the fields of a key");
+        }
+    }
+}
+
 // Why the value does not fit the check; empty when it fits.
 std::string Mismatch(const FieldCheck& check, const Json& value, const std::string& where);
 
@@ -301,14 +381,17 @@ std::string Mismatch(const FieldCheck& check, const Json& value, const std::stri
             return value.is_boolean() ? "" : "must be true or false" + found;
         case FieldCheck::Kind::Integer:
             return IsWhole(value, check.min, check.max) ? "" : "must be " + Range(check) + found;
-        case FieldCheck::Kind::Word: {
-            std::string list;
-            for (const char* word : check.words) {
-                if (value.is_string() && value.get<std::string>() == word) return "";
-                list += (list.empty() ? "" : ", ") + std::string(word);
+        case FieldCheck::Kind::Word:
+            return WordMismatch(check, value, found);
+        case FieldCheck::Kind::WordList:
+            if (!value.is_array()) return "must be an array of strings" + found;
+            for (std::size_t i = 0; i < value.size(); ++i) {
+                const std::string why = WordMismatch(
+                    check, value[i],
+                    std::string(", not ") + (value[i].is_number() ? value[i].dump() : value[i].type_name()));
+                if (!why.empty()) return "item " + std::to_string(i) + " " + why;
             }
-            return "must be one of " + list + (value.is_string() ? ", not '" + value.get<std::string>() + "'" : found);
-        }
+            return "";
         case FieldCheck::Kind::StringList:
             if (!value.is_array()) return "must be an array of strings" + found;
             for (std::size_t i = 0; i < value.size(); ++i) {
@@ -362,13 +445,15 @@ std::string Mismatch(const FieldCheck& check, const Json& value, const std::stri
 
 void CheckSectionFields(const std::string& section, const Json& value) {
     const FieldChecks* checks = ChecksOf(section);
-    if (!checks) return;
     if (value.is_object()) {
-        CheckFields(*checks, value, section);
+        if (checks) CheckFields(*checks, value, section);
         return;
     }
     for (std::size_t i = 0; i < value.size(); ++i) {
-        CheckFields(*checks, value[i], section + "[" + std::to_string(i) + "]");
+        const std::string where = section + "[" + std::to_string(i) + "]";
+        if (!value[i].is_object()) continue;
+        CheckJoinedKey(section, value[i], where);
+        if (checks) CheckFields(*checks, value[i], where);
     }
 }
 

@@ -4,6 +4,7 @@
 #include "hostctl/network/NetworkInfoImpl.h"
 #include "hostctl/network/ip/PldNic.h"
 #include "hostctl/network/vswitch/SwitchImpl.h"
+#include "network/dvs/DVSwitchImpl.h"
 #include "network/vswitch/VswitchRecords.h"
 
 namespace HostCtl {
@@ -34,6 +35,13 @@ std::unique_ptr<PortGroup> NetworkFactory::GetPortGroupByName(const std::string&
 
 std::unique_ptr<NetworkInfo> NetworkFactory::GetNetworkInfo() {
     return std::make_unique<PldCtl::Network::NetworkInfoImpl>();
+}
+
+std::unique_ptr<DVSwitch> NetworkFactory::GetDVSwitchByName(const std::string& name) {
+    std::unique_ptr<DVSwitch> dvswitch = PldCtl::Network::DVSwitchImpl::Find(
+        PldCtl::Detail::EnterOperation("NetworkFactory::GetDVSwitchByName", name), name);
+    if (!dvswitch) throw Lib::HostCtlException("no such distributed switch");
+    return dvswitch;
 }
 
 }  // namespace Network

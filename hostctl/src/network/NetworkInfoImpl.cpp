@@ -3,9 +3,12 @@
 #include <algorithm>
 
 #include "Operation.h"
+#include "hostctl/network/ip/NetstackInstanceImpl.h"
 #include "hostctl/network/nic/PnicImpl.h"
 #include "hostctl/network/vswitch/SwitchImpl.h"
 #include "network/NetworkRecords.h"
+#include "network/ip/IpLookup.h"
+#include "network/ip/NetstackRules.h"
 #include "network/nic/NicRecords.h"
 #include "network/vswitch/VswitchLookup.h"
 
@@ -131,6 +134,81 @@ std::vector<std::unique_ptr<HostCtl::Network::PortGroup>> NetworkInfoImpl::GetAl
         }
     });
     return portGroups;
+}
+
+int NetworkInfoImpl::GetNetstackInstanceState(const std::string& key) {
+    Store::HostStore& store = Detail::EnterOperation("NetworkInfoImpl::GetNetstackInstanceState", key);
+    std::optional<Detail::NetstackRecord> netstack = Detail::Get<Detail::NetstackRecord>(store, key);
+    return netstack ? netstack->state : 0;
+}
+
+void NetworkInfoImpl::AddNetstackInstance(HostCtl::Network::NetstackInstance* instance, bool disabled) {
+    if (!instance) throw HostCtl::Lib::HostCtlException("No netstack instance given");
+    const std::string key = instance->GetKey();
+    Store::HostStore& store = Detail::EnterOperation("NetworkInfoImpl::AddNetstackInstance", key);
+    Detail::CheckNetstackKey(key);
+    Detail::CheckMaxConnections(instance->GetMaxConnections(), key);
+    Detail::NetstackRecord record;
+    record.key = key;
+    record.name = instance->GetName();
+    record.maxConnections = instance->GetMaxConnections();
+    record.ccAlgorithm = instance->GetCongestionControlAlgorithm();
+    record.ipv6Enabled = instance->GetIpv6Enabled();
+    if (disabled) {
+        Detail::KeepInConfigurationOnly(record);
+    } else {
+        Detail::CreateInKernel(record);
+    }
+    store.Change([&](Store::Transaction& t) {
+        if (t.Exists(Detail::NetstackRecord::kSection, key)) {
+            throw HostCtl::Lib::HostCtlException("Netstack instance " + key + " already exists");
+        }
+        Detail::CheckCongestionControlAlgorithm(t, record.ccAlgorithm);
+        Detail::Create(t, record);
+    });
+}
+
+void NetworkInfoImpl::RemoveNetstackInstance(const std::string& key, bool) {
+    Store::HostStore& store = Detail::EnterOperation("NetworkInfoImpl::RemoveNetstackInstance", key);
+    if (key == HostCtl::Network::NetstackInstance::DEFAULT_KEY) {
+        throw HostCtl::Lib::HostCtlException("The default netstack instance cannot be removed");
+    }
+    store.Change([&](Store::Transaction& t) {
+        Detail::RequireNetstack(t, key);
+        std::vector<Detail::InterfaceRecord> interfaces = Detail::ListChildren<Detail::InterfaceRecord>(t, key);
+        if (!interfaces.empty()) {
+            std::stable_sort(interfaces.begin(), interfaces.end(), [](const auto& a, const auto& b) {
+                return Detail::InterfaceNumber(a.name) < Detail::InterfaceNumber(b.name);
+            });
+            std::string names;
+            for (const auto& nic : interfaces) names += (names.empty() ? "" : ", ") + nic.name;
+            throw HostCtl::Lib::HostCtlException("Netstack instance " + key + " still has interfaces: " + names);
+        }
+        // What lives in the instance goes with it.
+        for (const char* section :
+             {Store::Section::kRoutes, Store::Section::kNeighbors, Store::Section::kConnections}) {
+            t.RemoveChildren(section, key);
+        }
+        t.Remove(Detail::NetstackRecord::kSection, key);
+    });
+}
+
+std::unique_ptr<HostCtl::Network::NetstackInstance> NetworkInfoImpl::LookupNetstackInstanceByKey(
+    const std::string& key) {
+    Store::HostStore& store = Detail::EnterOperation("NetworkInfoImpl::LookupNetstackInstanceByKey", key);
+    std::optional<Detail::NetstackRecord> netstack = Detail::Get<Detail::NetstackRecord>(store, key);
+    if (!netstack) return nullptr;
+    return std::make_unique<NetstackInstanceImpl>(std::make_shared<const Detail::NetstackRecord>(std::move(*netstack)));
+}
+
+std::vector<std::unique_ptr<HostCtl::Network::NetstackInstance>> NetworkInfoImpl::ListNetstackInstances() {
+    Store::HostStore& store = Detail::EnterOperation("NetworkInfoImpl::ListNetstackInstances");
+    std::vector<std::unique_ptr<HostCtl::Network::NetstackInstance>> instances;
+    for (auto& netstack :
+         Detail::DecodeShared<Detail::NetstackRecord>(store.ListText(Detail::NetstackRecord::kSection))) {
+        instances.push_back(std::make_unique<NetstackInstanceImpl>(std::move(netstack)));
+    }
+    return instances;
 }
 
 }  // namespace Network

@@ -11,7 +11,8 @@ struct RecordFields<SystemRecord> {
     static constexpr auto All() {
         return std::make_tuple(
             Field("ipv6Enabled", &SystemRecord::ipv6Enabled),
-            Field("maxPorts", &SystemRecord::maxPorts));
+            Field("maxPorts", &SystemRecord::maxPorts),
+            Field("congestionControlAlgorithms", &SystemRecord::congestionControlAlgorithms));
     }
 };
 // clang-format on

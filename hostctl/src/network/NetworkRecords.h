@@ -3,6 +3,9 @@
 #pragma once
 
 #include <cstdint>
+#include <optional>
+#include <string>
+#include <vector>
 
 #include "hostctl/network/vswitch/VswitchTables.h"
 #include "hoststore/CollectionNames.h"
@@ -17,6 +20,9 @@ struct SystemRecord {
     bool ipv6Enabled = true;
     // The ports all switches may have together.
     std::int64_t maxPorts = HostCtl::Network::kMaxHostPorts;
+    // The congestion-control algorithms netstacks may use; unset: the
+    // library's own list.
+    std::optional<std::vector<std::string>> congestionControlAlgorithms;
 };
 
 }  // namespace Detail

@@ -123,5 +123,34 @@ void PortGroupImpl::SetOwnShapingPolicy(const ShapingPolicy& policy) {
     record_ = WriteOwnPolicy("PortGroupImpl::SetOwnShapingPolicy", Stored(), policy);
 }
 
+int PortGroupImpl::GetType() const {
+    return TYPE_PORT_GROUP;
+}
+
+std::string PortGroupImpl::GetPortsetName() const {
+    return GetVirtualSwitchName();
+}
+
+std::string PortGroupImpl::GetPortGroupName() const {
+    return name_;
+}
+
+HostCtl::Network::DVPortParam PortGroupImpl::GetDVPortParam() const {
+    return {};
+}
+
+HostCtl::Network::OpaqueNetworkParam PortGroupImpl::GetOpaqueNetworkParam() const {
+    return {};
+}
+
+bool PortGroupImpl::IsValid() const {
+    try {
+        Stored();
+        return true;
+    } catch (const std::exception&) {
+        return false;
+    }
+}
+
 }  // namespace Network
 }  // namespace PldCtl

@@ -21,9 +21,6 @@ using HostCtl::Network::PortGroup;
 
 namespace {
 
-// Port ids come in blocks of 2^24, one block a switch.
-constexpr std::int64_t kPortBlock = std::int64_t(1) << 24;
-
 bool Contains(const std::vector<std::string>& names, const std::string& name) {
     return std::find(names.begin(), names.end(), name) != names.end();
 }
@@ -286,10 +283,7 @@ void VirtualSwitchImpl::AddUplink(const std::string& nic) {
                 throw HostCtlException("Unable to add uplink " + nic + ": virtual switch " + name +
                                        " has no free port");
             }
-            // The next id of the switch's own block, or the first of a new block.
-            std::int64_t id = 0;
-            for (const PortRecord& port : ports) id = std::max(id, port.id);
-            id = id ? id + 1 : (t.MaxIntegerKey(PortRecord::kSection) / kPortBlock + 1) * kPortBlock + 1;
+            const std::int64_t id = Detail::NextPortId(t, ports);
             PortRecord uplink;
             uplink.id = id;
             uplink.portset = name;

@@ -82,5 +82,13 @@ void ReleaseNic(Store::Transaction& t, const std::string& nic) {
     }
 }
 
+std::int64_t NextPortId(Store::Transaction& t, const std::vector<PortRecord>& ports) {
+    // Each switch has a block of 2^24 ids.
+    constexpr std::int64_t kPortBlock = std::int64_t(1) << 24;
+    std::int64_t id = 0;
+    for (const PortRecord& port : ports) id = std::max(id, port.id);
+    return id ? id + 1 : (t.MaxIntegerKey(PortRecord::kSection) / kPortBlock + 1) * kPortBlock + 1;
+}
+
 }  // namespace Detail
 }  // namespace PldCtl

@@ -45,6 +45,10 @@ PortGroupsBySwitch ListPortGroupsBySwitch(Store::Transaction& t);
 // have is left alone).
 void ReleaseNic(Store::Transaction& t, const std::string& nic);
 
+// The id of a new port of a switch whose ports are `ports`: the next id of
+// the switch's own block, or the first of a new block.
+std::int64_t NextPortId(Store::Transaction& t, const std::vector<PortRecord>& ports);
+
 // Applies `edit(t, record)` to the stored switch or port group inside one
 // change (`operation` is the name faults are injected under) and returns the
 // record as written: objects refresh their snapshot from it.

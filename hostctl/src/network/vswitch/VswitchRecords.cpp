@@ -117,6 +117,7 @@ struct RecordFields<PortRecord> {
             Field(PortRecord::kTypeField, &PortRecord::type),
             Field(PortRecord::kClientField, &PortRecord::client),
             Field(PortRecord::kPortGroupField, &PortRecord::portgroup),
+            Field("dvPortId", &PortRecord::dvPortId),
             Field("vlanStatsEnabled", &PortRecord::vlanStatsEnabled),
             Field("vlanStats", &PortRecord::vlanStats));
     }

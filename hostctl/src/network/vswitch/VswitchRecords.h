@@ -102,6 +102,7 @@ struct PortRecord {
     std::string type = "vm";
     std::string client;  // "" for a free port
     std::string portgroup;
+    std::string dvPortId;  // the DV port of a port on a distributed switch
     // Uplink ports: per-VLAN counting, and its counters while it is on.
     bool vlanStatsEnabled = false;
     std::vector<VlanStatsRecord> vlanStats;

@@ -7,6 +7,14 @@
 #include "hostctl/Export.h"
 #include "hostctl/Values.h"
 
+namespace PldCtl {
+namespace Detail {
+// How the library fills a configuration from what it stores, IPv6 address
+// types and states included.
+struct IpConfigAccess;
+}  // namespace Detail
+}  // namespace PldCtl
+
 namespace HostCtl {
 namespace Network {
 
@@ -52,6 +60,7 @@ public:
     void RemoveIpv6Network(const Ipv6Network& network);
 
 private:
+    friend struct PldCtl::Detail::IpConfigAccess;
     Ipv4Mode mode_ = IPV4_NONE;
     Ipv4Address ipv4Address_;
     Ipv4Address ipv4Netmask_;
