@@ -108,98 +108,46 @@ $ orvixcli network ip interface ipv4 set -i pld0 -t bootp
 ## dhcp: without --peer-dns the flag stays as it was (off for pld0) ...
 $ orvixcli network ip interface ipv4 set -i pld0 -t dhcp
 
-$ orvixcli network ip interface ipv4 get -i pld0 --formatter=json
-[
-  {
-    "Name": "pld0",
-    "IPv4 Address": "192.0.2.30",
-    "IPv4 Netmask": "255.0.255.0",
-    "IPv4 Broadcast": "192.255.2.255",
-    "Address Type": "DHCP",
-    "DHCP DNS": false
-  }
-]
+$ orvixcli network ip interface ipv4 get -i pld0 --formatter=csv
+Name,IPv4 Address,IPv4 Netmask,IPv4 Broadcast,Address Type,DHCP DNS
+pld0,192.0.2.30,255.0.255.0,192.255.2.255,DHCP,false
 
 ## ... and with it the flag is set.
 $ orvixcli network ip interface ipv4 set -i pld0 -t dhcp --peer-dns true
 
-$ orvixcli network ip interface ipv4 get -i pld0 --formatter=json
-[
-  {
-    "Name": "pld0",
-    "IPv4 Address": "192.0.2.30",
-    "IPv4 Netmask": "255.0.255.0",
-    "IPv4 Broadcast": "192.255.2.255",
-    "Address Type": "DHCP",
-    "DHCP DNS": true
-  }
-]
+$ orvixcli network ip interface ipv4 get -i pld0 --formatter=csv
+Name,IPv4 Address,IPv4 Netmask,IPv4 Broadcast,Address Type,DHCP DNS
+pld0,192.0.2.30,255.0.255.0,192.255.2.255,DHCP,true
 
 ## A static address keeps the flag in force although it is not shown, and
 ## ignores --peer-dns: going back to DHCP shows the flag still on.
 $ orvixcli network ip interface ipv4 set -i pld0 -t static -I 192.0.2.31 -N 255.255.255.0 -P false
 
-$ orvixcli network ip interface ipv4 get -i pld0 --formatter=json
-[
-  {
-    "Name": "pld0",
-    "IPv4 Address": "192.0.2.31",
-    "IPv4 Netmask": "255.255.255.0",
-    "IPv4 Broadcast": "192.0.2.255",
-    "Address Type": "STATIC",
-    "DHCP DNS": false
-  }
-]
+$ orvixcli network ip interface ipv4 get -i pld0 --formatter=csv
+Name,IPv4 Address,IPv4 Netmask,IPv4 Broadcast,Address Type,DHCP DNS
+pld0,192.0.2.31,255.255.255.0,192.0.2.255,STATIC,false
 
 $ orvixcli network ip interface ipv4 set -i pld0 -t dhcp
 
-$ orvixcli network ip interface ipv4 get -i pld0 --formatter=json
-[
-  {
-    "Name": "pld0",
-    "IPv4 Address": "192.0.2.31",
-    "IPv4 Netmask": "255.255.255.0",
-    "IPv4 Broadcast": "192.0.2.255",
-    "Address Type": "DHCP",
-    "DHCP DNS": true
-  }
-]
+$ orvixcli network ip interface ipv4 get -i pld0 --formatter=csv
+Name,IPv4 Address,IPv4 Netmask,IPv4 Broadcast,Address Type,DHCP DNS
+pld0,192.0.2.31,255.255.255.0,192.0.2.255,DHCP,true
 
 ## The flag is shared with IPv6: pld1 uses DNS from DHCP, and an IPv4 change
 ## that does not name it keeps it for DHCPv6 too.
-$ orvixcli network ip interface ipv6 get -n pld1 --formatter=json
-[
-  {
-    "Name": "pld1",
-    "DHCPv6 Enabled": true,
-    "Router Adv Enabled": false,
-    "DHCP DNS": true
-  }
-]
+$ orvixcli network ip interface ipv6 get -n pld1 --formatter=csv
+Name,DHCPv6 Enabled,Router Adv Enabled,DHCP DNS
+pld1,true,false,true
 
 $ orvixcli network ip interface ipv4 set -i pld1 -t none
 
-$ orvixcli network ip interface ipv4 get -i pld1 --formatter=json
-[
-  {
-    "Name": "pld1",
-    "IPv4 Address": "0.0.0.0",
-    "IPv4 Netmask": "0.0.0.0",
-    "IPv4 Broadcast": "255.255.255.255",
-    "Address Type": "NONE",
-    "DHCP DNS": false
-  }
-]
+$ orvixcli network ip interface ipv4 get -i pld1 --formatter=csv
+Name,IPv4 Address,IPv4 Netmask,IPv4 Broadcast,Address Type,DHCP DNS
+pld1,0.0.0.0,0.0.0.0,255.255.255.255,NONE,false
 
-$ orvixcli network ip interface ipv6 get -n pld1 --formatter=json
-[
-  {
-    "Name": "pld1",
-    "DHCPv6 Enabled": true,
-    "Router Adv Enabled": false,
-    "DHCP DNS": true
-  }
-]
+$ orvixcli network ip interface ipv6 get -n pld1 --formatter=csv
+Name,DHCPv6 Enabled,Router Adv Enabled,DHCP DNS
+pld1,true,false,true
 
 $ orvixcli network ip interface ipv4 set --interface-name pld1 --type dhcp --formatter=json
 true

@@ -61,27 +61,15 @@ $ orvixcli network ip interface ipv6 set -i pld0 --enable-dhcpv6 true --formatte
 true
 
 ## DHCPv6 on, the flag as it was (off).
-$ orvixcli network ip interface ipv6 get -n pld0 --formatter=json
-[
-  {
-    "Name": "pld0",
-    "DHCPv6 Enabled": true,
-    "Router Adv Enabled": true,
-    "DHCP DNS": false
-  }
-]
+$ orvixcli network ip interface ipv6 get -n pld0 --formatter=csv
+Name,DHCPv6 Enabled,Router Adv Enabled,DHCP DNS
+pld0,true,true,false
 
 $ orvixcli network ip interface ipv6 set -i pld0 -P true -r false
 
-$ orvixcli network ip interface ipv6 get -n pld0 --formatter=json
-[
-  {
-    "Name": "pld0",
-    "DHCPv6 Enabled": true,
-    "Router Adv Enabled": false,
-    "DHCP DNS": true
-  }
-]
+$ orvixcli network ip interface ipv6 get -n pld0 --formatter=csv
+Name,DHCPv6 Enabled,Router Adv Enabled,DHCP DNS
+pld0,true,false,true
 
 ## The flag is shared with IPv4: pld0 is static, so it does not show there,
 ## and an IPv6 change without -P keeps it.
@@ -89,15 +77,9 @@ $ orvixcli network ip interface ipv6 set -i pld0 -d false
 
 $ orvixcli network ip interface ipv6 set -i pld0 -d true -r true
 
-$ orvixcli network ip interface ipv6 get -n pld0 --formatter=json
-[
-  {
-    "Name": "pld0",
-    "DHCPv6 Enabled": true,
-    "Router Adv Enabled": true,
-    "DHCP DNS": true
-  }
-]
+$ orvixcli network ip interface ipv6 get -n pld0 --formatter=csv
+Name,DHCPv6 Enabled,Router Adv Enabled,DHCP DNS
+pld0,true,true,true
 
 ## network ip interface ipv6 address list: one row per address, the type
 ## and status in words; an interface without addresses shows nothing.
@@ -111,16 +93,9 @@ pld0       2001:db8:10::22              64       STATIC    DUPLICATED
 pld1       2001:db8:20::21              128      DHCP      PREFERRED
 pld2       2001:db8:30::21              64       STATIC    TENTATIVE
 
-$ orvixcli network ip interface ipv6 address list -i pld1 --formatter=json
-[
-  {
-    "Interface": "pld1",
-    "Address": "2001:db8:20::21",
-    "Netmask": 128,
-    "Type": "DHCP",
-    "Status": "PREFERRED"
-  }
-]
+$ orvixcli network ip interface ipv6 address list -i pld1 --formatter=csv
+Interface,Address,Netmask,Type,Status
+pld1,2001:db8:20::21,128,DHCP,PREFERRED
 
 $ orvixcli network ip interface ipv6 address list -i pld9
 ! Unable to find a Pallad interface with the name pld9
@@ -155,15 +130,9 @@ Interface  Address          Netmask  Type    Status
 pld2       2001:db8:30::21  64       STATIC  TENTATIVE
 pld2       2001:db8:40::1   64       STATIC  PREFERRED
 
-$ orvixcli network ip interface ipv6 get -n pld1 --formatter=json
-[
-  {
-    "Name": "pld1",
-    "DHCPv6 Enabled": true,
-    "Router Adv Enabled": false,
-    "DHCP DNS": true
-  }
-]
+$ orvixcli network ip interface ipv6 get -n pld1 --formatter=csv
+Name,DHCPv6 Enabled,Router Adv Enabled,DHCP DNS
+pld1,true,false,true
 
 ## network ip interface ipv6 address remove: the address with its prefix.
 $ orvixcli network ip interface ipv6 address remove -i pld9 -I 2001:db8:40::1
@@ -192,15 +161,9 @@ pld0,2001:db8:10::22,64,STATIC,DUPLICATED
 pld1,2001:db8:20::99,64,STATIC,PREFERRED
 pld2,2001:db8:30::21,64,STATIC,TENTATIVE
 
-$ orvixcli network ip interface ipv6 get -n pld1 --formatter=json
-[
-  {
-    "Name": "pld1",
-    "DHCPv6 Enabled": true,
-    "Router Adv Enabled": false,
-    "DHCP DNS": true
-  }
-]
+$ orvixcli network ip interface ipv6 get -n pld1 --formatter=csv
+Name,DHCPv6 Enabled,Router Adv Enabled,DHCP DNS
+pld1,true,false,true
 
 ## -P false turns it off.
 $ orvixcli network ip interface ipv6 set -i pld1 --peer-dns false --enable-router-adv true

@@ -128,37 +128,15 @@ $ orvixcli network ip netstack set -N coldStack
 
 $ orvixcli network ip netstack set -N coldStack --name ""
 
-$ orvixcli network ip netstack get -N coldStack --formatter=json
-[
-  {
-    "Key": "coldStack",
-    "Name": "coldStack",
-    "Enabled": false,
-    "Max Connections": 11000,
-    "Current Max Connections": 0,
-    "Congestion Control Algorithm": "newreno",
-    "IPv6 Enabled": true,
-    "Current IPv6 Enabled": false,
-    "State": 2
-  }
-]
+$ orvixcli network ip netstack get -N coldStack --formatter=csv
+Key,Name,Enabled,Max Connections,Current Max Connections,Congestion Control Algorithm,IPv6 Enabled,Current IPv6 Enabled,State
+coldStack,coldStack,false,11000,0,newreno,true,false,2
 
 $ orvixcli network ip netstack set -N coldStack -n "Cold standby" -m 20000 -c cubic -i false
 
-$ orvixcli network ip netstack get -N coldStack --formatter=json
-[
-  {
-    "Key": "coldStack",
-    "Name": "Cold standby",
-    "Enabled": false,
-    "Max Connections": 20000,
-    "Current Max Connections": 0,
-    "Congestion Control Algorithm": "cubic",
-    "IPv6 Enabled": false,
-    "Current IPv6 Enabled": false,
-    "State": 2
-  }
-]
+$ orvixcli network ip netstack get -N coldStack --formatter=csv
+Key,Name,Enabled,Max Connections,Current Max Connections,Congestion Control Algorithm,IPv6 Enabled,Current IPv6 Enabled,State
+coldStack,Cold standby,false,20000,0,cubic,false,false,2
 
 ## Enabling creates the instance in the kernel with the configured limit and
 ## IPv6 switch.
@@ -238,20 +216,9 @@ $ orvixcli network ip netstack set -N coldStack -n Partial -m -5 -c newreno
 ! Error setting configuration for the netstack instance coldStack. Error was : Invalid maximum connections value -5 for netstack instance coldStack: must be between 1 and 2147483647
 [1]
 
-$ orvixcli network ip netstack get -N coldStack --formatter=json
-[
-  {
-    "Key": "coldStack",
-    "Name": "Partial",
-    "Enabled": false,
-    "Max Connections": 20000,
-    "Current Max Connections": 0,
-    "Congestion Control Algorithm": "cubic",
-    "IPv6 Enabled": false,
-    "Current IPv6 Enabled": false,
-    "State": 2
-  }
-]
+$ orvixcli network ip netstack get -N coldStack --formatter=csv
+Key,Name,Enabled,Max Connections,Current Max Connections,Congestion Control Algorithm,IPv6 Enabled,Current IPv6 Enabled,State
+coldStack,Partial,false,20000,0,cubic,false,false,2
 
 $ orvixcli network ip netstack set -N coldStack -m 2147483647
 
