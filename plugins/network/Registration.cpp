@@ -13,12 +13,24 @@
 #include "ip/IpGet.h"
 #include "ip/IpSet.h"
 #include "ip/interface/IpInterfaceAdd.h"
+#include "ip/interface/IpInterfaceIpv4Get.h"
+#include "ip/interface/IpInterfaceIpv4Set.h"
+#include "ip/interface/IpInterfaceIpv6AddressAdd.h"
+#include "ip/interface/IpInterfaceIpv6AddressList.h"
+#include "ip/interface/IpInterfaceIpv6AddressRemove.h"
+#include "ip/interface/IpInterfaceIpv6Get.h"
+#include "ip/interface/IpInterfaceIpv6Set.h"
 #include "ip/interface/IpInterfaceList.h"
 #include "ip/interface/IpInterfaceRemove.h"
 #include "ip/interface/IpInterfaceSet.h"
 #include "ip/interface/IpInterfaceTagAdd.h"
 #include "ip/interface/IpInterfaceTagGet.h"
 #include "ip/interface/IpInterfaceTagRemove.h"
+#include "ip/netstack/IpNetstackInstanceAdd.h"
+#include "ip/netstack/IpNetstackInstanceGet.h"
+#include "ip/netstack/IpNetstackInstanceList.h"
+#include "ip/netstack/IpNetstackInstanceRemove.h"
+#include "ip/netstack/IpNetstackInstanceSet.h"
 #include "nic/NicCoalesceGet.h"
 #include "nic/NicCoalesceSet.h"
 #include "nic/NicCsoGet.h"
@@ -187,19 +199,19 @@ extern "C" __attribute__((visibility("default"))) void AutoCli_RegisterNamespace
     auto ipInterfaceTag = Attach(ipInterface, "tag", "Commands to add and remove tags on pldnics.");
 
     // network ip interface ipv4
-    // get: IpInterfaceIpv4Get
-    // set: IpInterfaceIpv4Set
+    ipInterfaceIpv4->RegisterNamespaceNode(IpInterfaceIpv4Get::New(), "get");
+    ipInterfaceIpv4->RegisterNamespaceNode(IpInterfaceIpv4Set::New(), "set");
 
     // network ip interface ipv6
-    // set: IpInterfaceIpv6Set
-    // get: IpInterfaceIpv6Get
+    ipInterfaceIpv6->RegisterNamespaceNode(IpInterfaceIpv6Set::New(), "set");
+    ipInterfaceIpv6->RegisterNamespaceNode(IpInterfaceIpv6Get::New(), "get");
     auto ipInterfaceIpv6Address =
         Attach(ipInterfaceIpv6, "address", "Commands to list and update IPv6 addresses assigned to the system.");
 
     // network ip interface ipv6 address
-    // list: IpInterfaceIpv6AddressList
-    // add: IpInterfaceIpv6AddressAdd
-    // remove: IpInterfaceIpv6AddressRemove
+    ipInterfaceIpv6Address->RegisterNamespaceNode(IpInterfaceIpv6AddressList::New(), "list");
+    ipInterfaceIpv6Address->RegisterNamespaceNode(IpInterfaceIpv6AddressAdd::New(), "add");
+    ipInterfaceIpv6Address->RegisterNamespaceNode(IpInterfaceIpv6AddressRemove::New(), "remove");
 
     // network ip interface tag
     ipInterfaceTag->RegisterNamespaceNode(IpInterfaceTagAdd::New(), "add");
@@ -207,11 +219,11 @@ extern "C" __attribute__((visibility("default"))) void AutoCli_RegisterNamespace
     ipInterfaceTag->RegisterNamespaceNode(IpInterfaceTagGet::New(), "get");
 
     // network ip netstack
-    // list: IpNetstackInstanceList
-    // add: IpNetstackInstanceAdd
-    // remove: IpNetstackInstanceRemove
-    // get: IpNetstackInstanceGet
-    // set: IpNetstackInstanceSet
+    ipNetstack->RegisterNamespaceNode(IpNetstackInstanceList::New(), "list");
+    ipNetstack->RegisterNamespaceNode(IpNetstackInstanceAdd::New(), "add");
+    ipNetstack->RegisterNamespaceNode(IpNetstackInstanceRemove::New(), "remove");
+    ipNetstack->RegisterNamespaceNode(IpNetstackInstanceGet::New(), "get");
+    ipNetstack->RegisterNamespaceNode(IpNetstackInstanceSet::New(), "set");
 
     // network nic
     nic->RegisterNamespaceNode(NicList::New(), "list");
