@@ -22,14 +22,7 @@ struct LinkModeRecord {
     std::string duplex = "auto";  // "auto", "full" or "half"
 };
 
-struct PauseRecord {
-    bool supported = false;
-    bool autoNegotiate = false;
-    bool rx = false;
-    bool tx = false;
-    int rxResolution = 0;
-    int txResolution = 0;
-};
+using PauseRecord = HostCtl::Network::PauseParams;
 
 struct CoalesceRecord {
     bool adaptiveRx = false;

@@ -380,9 +380,7 @@ void PnicImpl::SetPnicInfo(const PnicInfo& info) {
 }
 
 void PnicImpl::GetPauseParams(PauseParams& params) {
-    const Detail::PauseRecord& pause = Enter("PnicImpl::GetPauseParams", name_, record_).pause;
-    params =
-        PauseParams{pause.supported, pause.autoNegotiate, pause.rx, pause.tx, pause.rxResolution, pause.txResolution};
+    params = Enter("PnicImpl::GetPauseParams", name_, record_).pause;
 }
 
 void PnicImpl::SetPauseParams(const PauseParams& params) {
