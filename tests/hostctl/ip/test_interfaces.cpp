@@ -24,9 +24,11 @@ TEST_F(Interfaces, AddOnAPortGroupTakesAPortAndRemoveGivesItBack) {
     EXPECT_EQ(nic->GetMacAddress().GetStringAddress(), "02:a1:01:00:00:04");
     EXPECT_EQ(nic->GetMtu(), 1500);
     EXPECT_EQ(nic->GetPortId(), 33554442);
-    EXPECT_EQ(Stored("ports", "id", 33554442),
-              (Json{{"id", 33554442}, {"portset", "vSwitch0"}, {"type", "kernel"}, {"client", "pld3"},
-                    {"portgroup", "VM Network"}}));
+    EXPECT_EQ(Stored("ports", "id", 33554442), (Json{{"id", 33554442},
+                                                     {"portset", "vSwitch0"},
+                                                     {"type", "kernel"},
+                                                     {"client", "pld3"},
+                                                     {"portgroup", "VM Network"}}));
     const Json stored = Stored("interfaces", "name", "pld3");
     EXPECT_EQ(stored["netstack"], kDefault);
     EXPECT_EQ(stored["portgroup"], "VM Network");
@@ -214,11 +216,12 @@ TEST_F(Interfaces, IpConfigRoundTripsAndTheDhcpDnsFlagComesOnlyWithTheDnsConfig)
     EXPECT_EQ(stored["ipv4Mode"], "none");
     EXPECT_EQ(stored["ipv4Address"], "0.0.0.0");
     EXPECT_EQ(stored["ipv6Dhcp"], true);
-    EXPECT_EQ(stored["ipv6Addresses"],
-              (Json::array({{{"address", "2001:db8:10:0:a1:1ff:fe00:1/64"}, {"type", "autoconf"}, {"status", "preferred"}},
-                            {{"address", "2001:db8:11:0:a1:1ff:fe00:1/64"}, {"type", "autoconf"}, {"status", "deprecated"}},
-                            {{"address", "2001:db8:10::22/64"}, {"type", "static"}, {"status", "duplicated"}},
-                            {{"address", "2001:db8:10::99/64"}, {"type", "static"}, {"status", "preferred"}}})));
+    EXPECT_EQ(
+        stored["ipv6Addresses"],
+        (Json::array({{{"address", "2001:db8:10:0:a1:1ff:fe00:1/64"}, {"type", "autoconf"}, {"status", "preferred"}},
+                      {{"address", "2001:db8:11:0:a1:1ff:fe00:1/64"}, {"type", "autoconf"}, {"status", "deprecated"}},
+                      {{"address", "2001:db8:10::22/64"}, {"type", "static"}, {"status", "duplicated"}},
+                      {{"address", "2001:db8:10::99/64"}, {"type", "static"}, {"status", "preferred"}}})));
     EXPECT_EQ(pld0->GetIpConfig().GetIpv6Network().size(), 4u);
 }
 

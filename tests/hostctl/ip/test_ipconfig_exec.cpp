@@ -1,6 +1,6 @@
 // The IpConfig value's rules, and the host's exec log.
-#include "hostctl/util/Exec.h"
 #include "hostctl/ip/IpHost.h"
+#include "hostctl/util/Exec.h"
 
 namespace {
 

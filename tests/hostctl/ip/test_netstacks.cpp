@@ -51,9 +51,12 @@ TEST_F(Netstacks, RefusedAddsWriteNothing) {
         return MessageOf([&] { network_.AddNetstackInstance(&instance, false); });
     };
     EXPECT_EQ(add("migrix", 11000, "newreno"), "Netstack instance migrix already exists");
-    EXPECT_EQ(add("a b", 11000, "newreno"), "Invalid netstack instance name a b: use 1 to 64 letters, digits, '-', '_' or '.'");
-    EXPECT_EQ(add("", 11000, "newreno"), "Invalid netstack instance name : use 1 to 64 letters, digits, '-', '_' or '.'");
-    EXPECT_EQ(add("a|b", 11000, "newreno"), "Invalid netstack instance name a|b: use 1 to 64 letters, digits, '-', '_' or '.'");
+    EXPECT_EQ(add("a b", 11000, "newreno"),
+              "Invalid netstack instance name a b: use 1 to 64 letters, digits, '-', '_' or '.'");
+    EXPECT_EQ(add("", 11000, "newreno"),
+              "Invalid netstack instance name : use 1 to 64 letters, digits, '-', '_' or '.'");
+    EXPECT_EQ(add("a|b", 11000, "newreno"),
+              "Invalid netstack instance name a|b: use 1 to 64 letters, digits, '-', '_' or '.'");
     EXPECT_EQ(add(std::string(65, 'k'), 11000, "newreno").substr(0, 30), "Invalid netstack instance name");
     EXPECT_EQ(add(std::string(64, 'k'), 11000, "bbr"), "Unknown congestion control algorithm bbr");
     EXPECT_EQ(add("lab", 0, "newreno"),
@@ -129,12 +132,14 @@ TEST_F(Netstacks, TheAlgorithmListComesFromTheHostAndSurvivesABrokenOne) {
 
     OrvixTest::WriteFile(DbPath(), std::string(4096, 'x'));
     PldCtl::Lib::ReopenHost();
-    EXPECT_EQ(NetstackInstanceImpl::GetCongestionControlAlgorithmList(), (std::vector<std::string>{"newreno", "cubic"}));
+    EXPECT_EQ(NetstackInstanceImpl::GetCongestionControlAlgorithmList(),
+              (std::vector<std::string>{"newreno", "cubic"}));
 }
 
 TEST_F(Netstacks, AHostThatNamesNoAlgorithmsOffersTheLibrarysOwn) {
     MakeHost(R"({"format": "orvix-host-profile", "version": 1, "netstacks": [{"key": "defaultTcpipStack"}]})");
-    EXPECT_EQ(NetstackInstanceImpl::GetCongestionControlAlgorithmList(), (std::vector<std::string>{"newreno", "cubic"}));
+    EXPECT_EQ(NetstackInstanceImpl::GetCongestionControlAlgorithmList(),
+              (std::vector<std::string>{"newreno", "cubic"}));
     Lookup(kDefault)->SetCongestionControlAlgorithm("cubic", true);
     EXPECT_EQ(Lookup(kDefault)->GetCongestionControlAlgorithm(), "cubic");
 }
