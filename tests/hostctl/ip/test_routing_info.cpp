@@ -277,6 +277,18 @@ TEST_F(Routing, NeighborsAreRemovedFromOneInterfaceOrFromAll) {
     EXPECT_EQ(ipv4.size(), 1u);
 }
 
+TEST_F(Routing, RoutesAndNeighborsOfARemovedInterfaceGoWithIt) {
+    Nic("pld1")->Remove();
+    for (const auto& line : Ipv4Routes()) EXPECT_EQ(line.find(" on pld1"), std::string::npos) << line;
+    for (const auto& line : Ipv6Routes()) EXPECT_EQ(line.find(" on pld1"), std::string::npos) << line;
+    std::vector<Ipv4Neighbor> neighbors;
+    routing_.GetCurrentIpv4PalladNeighbors(neighbors, "pld1");
+    EXPECT_TRUE(neighbors.empty());
+    routing_.GetCurrentIpv4PalladNeighbors(neighbors, "pld0");
+    EXPECT_FALSE(neighbors.empty());
+    EXPECT_EQ(Ipv4Routes().front(), "0.0.0.0/0 via 192.0.2.1 on pld0");
+}
+
 TEST_F(Routing, InjectedFaultsFailTheirOperationOnTheirNetstackOnly) {
     ArmFault("RoutingInfoImpl::AddPalladRoute", kDefault, "routing table locked");
     ArmFault("RoutingInfoImpl::GetCurrentIpv4PalladNeighbors", "migrix", "arp cache unreadable");
