@@ -99,6 +99,9 @@ TEST_F(Routing, RefusedRoutesWriteNothing) {
     // A network reached directly needs an interface in it.
     EXPECT_EQ(add("10.0.0.0/8", "0.0.0.0"),
               "Gateway 0.0.0.0 is not reachable from any interface of netstack defaultTcpipStack");
+    // Adding a default route never clears one.
+    EXPECT_EQ(add("0.0.0.0/0", "0.0.0.0"),
+              "Gateway 0.0.0.0 is not reachable from any interface of netstack defaultTcpipStack");
     // pld2 reaches 203.0.113.1, but it belongs to another netstack.
     EXPECT_EQ(add("10.0.0.0/8", "203.0.113.1"),
               "Gateway 203.0.113.1 is not reachable from any interface of netstack defaultTcpipStack");

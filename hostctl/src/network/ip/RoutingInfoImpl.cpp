@@ -179,6 +179,8 @@ void AddRoute(const char* operation, const std::string& netstack, const typename
             throw HostCtlException(RouteText(networkText, gatewayText) + " already exists on netstack " + netstack);
         }
         if (IsDefault(network)) {
+            // No interface reaches every address directly.
+            if (!gateway.IsSet()) PickInterface<F>(t, netstack, network, gateway);
             // One default route per family: another gateway's stands.
             for (const RouteRecord& route : RoutesOf(t, netstack)) {
                 if (route.network == networkText) {
