@@ -1,7 +1,7 @@
 // Writes a large host profile on stdout, for the benchmark: about 1000
 // standard switches with 4096 ports in all, 2000 port groups, 256 kernel
-// interfaces over 16 netstacks, 10000 routes, 2000 neighbors, 5000
-// connections of 64 worlds and 64 NICs with their driver data.
+// interfaces over 16 netstacks, 10000 IPv4 routes (and 256 IPv6 ones), 2000
+// neighbors, 5000 connections of 64 worlds and 64 NICs with their driver data.
 // Deterministic: the same profile every time.
 #include <cstdint>
 #include <cstdio>
@@ -19,9 +19,8 @@ constexpr int kPorts = 4096;
 constexpr int kPortGroupsPerSwitch = 2;
 constexpr int kInterfaces = 256;
 constexpr int kNetstacks = 16;
-constexpr int kRoutes = 10000;
-// Of the routes, IPv4 ones (the rest are IPv6).
-constexpr int kIpv4Routes = 8000;
+constexpr int kIpv4Routes = 10000;
+constexpr int kIpv6Routes = 256;
 constexpr int kNeighbors = 2000;
 constexpr int kConnections = 5000;
 constexpr int kWorlds = 64;
@@ -231,7 +230,7 @@ int main() {
                       {"gateway", "198.51.100.254"},
                       {"interface", "pld0"}});
     const char* const v4Ranges[] = {"192.0.2.", "198.51.100.", "203.0.113."};
-    for (int r = 1; r < kRoutes; ++r) {
+    for (int r = 1; r < kIpv4Routes + kIpv6Routes; ++r) {
         if (r < kIpv4Routes) {
             const int host = r % (3 * 256);
             routes.push_back({{"netstack", "defaultTcpipStack"},
