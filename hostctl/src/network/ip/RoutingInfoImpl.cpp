@@ -37,8 +37,6 @@ const Ipv6Network RoutingInfoImpl::DEFAULT_IPV6_ROUTE(Ipv6Address(), 0);
 
 namespace {
 
-constexpr const char* kManual = "MANUAL";
-
 // What differs between the families, for the operations written once.
 struct V4 {
     using Network = Ipv4Network;
@@ -391,7 +389,8 @@ std::string RoutingInfoImpl::GetDefaultGatewaySource(const Ipv4Network& network)
         const auto known = sources_->byNetwork.find(networkText);
         if (known != sources_->byNetwork.end()) return known->second;
     }
-    std::string source = kManual;
+    // Where no route says otherwise, the route's default source.
+    std::string source = RouteRecord().source;
     store.Read([&](Store::Transaction& t) {
         RequireNetstackExists(t, netstack_);
         for (const RouteRecord& route : RoutesOf(t, netstack_)) {
