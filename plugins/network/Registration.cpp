@@ -12,6 +12,12 @@
 #include "framework/AutoCli.h"
 #include "ip/IpGet.h"
 #include "ip/IpSet.h"
+#include "ip/dns/IpDNSSearchAdd.h"
+#include "ip/dns/IpDNSSearchList.h"
+#include "ip/dns/IpDNSSearchRemove.h"
+#include "ip/dns/IpDNSServerAdd.h"
+#include "ip/dns/IpDNSServerList.h"
+#include "ip/dns/IpDNSServerRemove.h"
 #include "ip/interface/IpInterfaceAdd.h"
 #include "ip/interface/IpInterfaceIpv4Get.h"
 #include "ip/interface/IpInterfaceIpv4Set.h"
@@ -31,6 +37,12 @@
 #include "ip/netstack/IpNetstackInstanceList.h"
 #include "ip/netstack/IpNetstackInstanceRemove.h"
 #include "ip/netstack/IpNetstackInstanceSet.h"
+#include "ip/route/IpRouteIpv4Add.h"
+#include "ip/route/IpRouteIpv4List.h"
+#include "ip/route/IpRouteIpv4Remove.h"
+#include "ip/route/IpRouteIpv6Add.h"
+#include "ip/route/IpRouteIpv6List.h"
+#include "ip/route/IpRouteIpv6Remove.h"
 #include "nic/NicCoalesceGet.h"
 #include "nic/NicCoalesceSet.h"
 #include "nic/NicCsoGet.h"
@@ -151,28 +163,28 @@ extern "C" __attribute__((visibility("default"))) void AutoCli_RegisterNamespace
     auto ipDnsSearch = Attach(ipDns, "search", "Operations pertaining to DNS search domain configuration.");
 
     // network ip dns server
-    // list: IpDNSServerList
-    // add: IpDNSServerAdd
-    // remove: IpDNSServerRemove
+    ipDnsServer->RegisterNamespaceNode(IpDNSServerList::New(), "list");
+    ipDnsServer->RegisterNamespaceNode(IpDNSServerAdd::New(), "add");
+    ipDnsServer->RegisterNamespaceNode(IpDNSServerRemove::New(), "remove");
 
     // network ip dns search
-    // add: IpDNSSearchAdd
-    // remove: IpDNSSearchRemove
-    // list: IpDNSSearchList
+    ipDnsSearch->RegisterNamespaceNode(IpDNSSearchAdd::New(), "add");
+    ipDnsSearch->RegisterNamespaceNode(IpDNSSearchRemove::New(), "remove");
+    ipDnsSearch->RegisterNamespaceNode(IpDNSSearchList::New(), "list");
 
     // network ip route
     auto ipRouteIpv4 = Attach(ipRoute, "ipv4", "IPv4 route operations");
     auto ipRouteIpv6 = Attach(ipRoute, "ipv6", "IPv6 route operations");
 
     // network ip route ipv4
-    // add: IpRouteIpv4Add
-    // remove: IpRouteIpv4Remove
-    // list: IpRouteIpv4List
+    ipRouteIpv4->RegisterNamespaceNode(IpRouteIpv4Add::New(), "add");
+    ipRouteIpv4->RegisterNamespaceNode(IpRouteIpv4Remove::New(), "remove");
+    ipRouteIpv4->RegisterNamespaceNode(IpRouteIpv4List::New(), "list");
 
     // network ip route ipv6
-    // add: IpRouteIpv6Add
-    // remove: IpRouteIpv6Remove
-    // list: IpRouteIpv6List
+    ipRouteIpv6->RegisterNamespaceNode(IpRouteIpv6Add::New(), "add");
+    ipRouteIpv6->RegisterNamespaceNode(IpRouteIpv6Remove::New(), "remove");
+    ipRouteIpv6->RegisterNamespaceNode(IpRouteIpv6List::New(), "list");
 
     // network ip ipsec
     // set: IpIpsecSet

@@ -176,6 +176,65 @@ TEST(ProfileTest, NicDriverDataIsCheckedToItsDepth) {
               "(accepted)");
 }
 
+TEST(ProfileTest, AddressesRoutesAndIpsecFieldsAreCheckedAsTheLibraryCompares) {
+    auto section = [](const std::string& name, const std::string& object) {
+        return ErrorOf(WithSections(R"("netstacks": [{"key": "s"}], ")" + name + R"(": [)" + object + "]"));
+    };
+    auto route = [&](const std::string& network, const std::string& gateway) {
+        return section("routes",
+                       R"({"netstack": "s", "network": ")" + network + R"(", "gateway": ")" + gateway + R"("})");
+    };
+    EXPECT_EQ(route("192.0.2.0/24", "0.0.0.0"), "(accepted)");
+    EXPECT_EQ(route("2001:db8:10::/64", "fe80::1"), "(accepted)");
+    // Keys are compared as text: only the library's canonical text fits.
+    EXPECT_EQ(route("2001:DB8:10::/64", "::"),
+              "profile t.json: routes[0].network: must be an IP network address/prefix in canonical text with no host "
+              "bits set, not '2001:DB8:10::/64'");
+    EXPECT_EQ(route("192.0.2.1/24", "0.0.0.0"),
+              "profile t.json: routes[0].network: must be an IP network address/prefix in canonical text with no host "
+              "bits set, not '192.0.2.1/24'");
+    EXPECT_EQ(route("192.0.2.0/033", "0.0.0.0").substr(0, 42), "profile t.json: routes[0].network: must be");
+    EXPECT_EQ(route("192.0.2.0/24", "192.0.2.01"),
+              "profile t.json: routes[0].gateway: must be an IP address in canonical text, not '192.0.2.01'");
+    EXPECT_EQ(route("192.0.2.0/24", "::"),
+              "profile t.json: routes[0].gateway: must be an IPv4 address like its network, not '::'");
+
+    auto netstack = [](const std::string& fields) {
+        return ErrorOf(WithSections(R"("netstacks": [{"key": "s", )" + fields + "}]"));
+    };
+    EXPECT_EQ(netstack(R"("ipv4Gateway": "", "ipv6Gateway": "2001:db8::1", "dnsServers": ["192.0.2.53", "::1"],
+                          "searchDomains": ["example.test"])"),
+              "(accepted)");
+    EXPECT_EQ(netstack(R"("ipv4Gateway": "2001:db8::1")"),
+              "profile t.json: netstacks[0].ipv4Gateway: must be an IPv4 address in canonical text or \"\", not "
+              "'2001:db8::1'");
+    EXPECT_EQ(netstack(R"("dnsServers": ["192.0.2.53", "resolver"])"),
+              "profile t.json: netstacks[0].dnsServers: item 1 must be an IP address in canonical text, not "
+              "'resolver'");
+    EXPECT_EQ(netstack(R"("searchDomains": ["a.example.test b.example.test"])"),
+              "profile t.json: netstacks[0].searchDomains: item 0 must be a name without blanks or control "
+              "characters, not 'a.example.test b.example.test'");
+
+    EXPECT_EQ(
+        section("neighbors", R"({"netstack": "s", "interface": "pld0", "address": "192.0.2.1", "type": "Router"})"),
+        "(accepted)");
+    EXPECT_EQ(
+        section("neighbors", R"({"netstack": "s", "interface": "pld0", "address": "192.0.2.1", "state": "Gone"})"),
+        "profile t.json: neighbors[0].state: must be one of Incomplete, Reachable, Stale, Delay, Probe, not "
+        "'Gone'");
+    EXPECT_EQ(section("connections", R"({"netstack": "s", "proto": "tcp", "localAddress": "0.0.0.0", "localPort": 65536,
+                                         "foreignAddress": "0.0.0.0", "foreignPort": 0, "state": "SYN_RCVD"})"),
+              "profile t.json: connections[0].localPort: must be an integer from 0 to 65535, not 65536");
+    EXPECT_EQ(ErrorOf(WithSections(R"("worlds": [{"id": 4294967296}])")),
+              "profile t.json: worlds[0].id: must be an integer from 0 to 4294967295, not 4294967296");
+    EXPECT_EQ(ErrorOf(WithSections(R"("ipsecSAs": [{"name": "a", "spi": 1, "source": "192.0.2.1"}])")),
+              "profile t.json: ipsecSAs[0].source: must be an IPv6 address in canonical text, not '192.0.2.1'");
+    EXPECT_EQ(ErrorOf(WithSections(R"("ipsecSPs": [{"name": "a", "direction": "both"}])")),
+              "profile t.json: ipsecSPs[0].direction: must be one of in, out, not 'both'");
+    EXPECT_EQ(ErrorOf(WithSections(R"("ipsec": {"ikeDaemonsRunning": "yes"})")),
+              "profile t.json: ipsec.ikeDaemonsRunning: must be true or false, not string");
+}
+
 TEST(ProfileTest, NumbersBeyondTheParserAreRefusedWithTheirPlace) {
     const std::string huge = "1" + std::string(400, '0');
     const std::string message = ErrorOf(WithSections("\n\"system\": {\"x\": \"9e999\", \"maxPorts\": " + huge + "}"));

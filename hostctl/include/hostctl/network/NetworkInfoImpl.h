@@ -9,6 +9,7 @@
 #include "hostctl/Export.h"
 #include "hostctl/network/NetworkInfo.h"
 #include "hostctl/network/ip/NetstackInstance.h"
+#include "hostctl/network/ip/TcpIpConnection.h"
 #include "hostctl/network/vswitch/VirtualSwitch.h"
 
 namespace PldCtl {
@@ -55,6 +56,16 @@ public:
     virtual std::unique_ptr<HostCtl::Network::NetstackInstance> LookupNetstackInstanceByKey(const std::string& key);
     // In the host's order.
     virtual std::vector<std::unique_ptr<HostCtl::Network::NetstackInstance>> ListNetstackInstances();
+
+    // The open endpoints of a netstack instance, per protocol, in the host's
+    // order; `connections` is filled, not appended to. Throws for a netstack
+    // the host does not have.
+    virtual void GetCurrentTcpPalladConnections(std::vector<HostCtl::Network::TcpIpConnection>& connections,
+                                                const std::string& netstack);
+    virtual void GetCurrentUdpPalladConnections(std::vector<HostCtl::Network::TcpIpConnection>& connections,
+                                                const std::string& netstack);
+    virtual void GetCurrentIpPalladConnections(std::vector<HostCtl::Network::TcpIpConnection>& connections,
+                                               const std::string& netstack);
 
     // Every port group of every standard switch, switch by switch.
     virtual std::vector<std::unique_ptr<HostCtl::Network::PortGroup>> GetAllPortGroups();

@@ -171,6 +171,17 @@ void RemoveInterface(Store::Transaction& t, const InterfaceRecord& record) {
         std::optional<PortRecord> port = Get<PortRecord>(t, portKey);
         if (port && port->client == record.name) t.Remove(PortRecord::kSection, portKey);
     }
+    // Routes out of the interface and the neighbors seen on it go with it.
+    for (const RouteRecord& route : ListChildren<RouteRecord>(t, record.netstack)) {
+        if (route.interfaceName == record.name) {
+            t.Remove(RouteRecord::kSection, JoinedKey({route.netstack, route.network, route.gateway}));
+        }
+    }
+    for (const NeighborRecord& neighbor : ListChildren<NeighborRecord>(t, record.netstack)) {
+        if (neighbor.interfaceName == record.name) {
+            t.Remove(NeighborRecord::kSection, JoinedKey({neighbor.netstack, neighbor.interfaceName, neighbor.address}));
+        }
+    }
     t.Remove(InterfaceRecord::kSection, record.name);
 }
 
