@@ -12,6 +12,16 @@
 #include "framework/AutoCli.h"
 #include "ip/IpGet.h"
 #include "ip/IpSet.h"
+#include "ip/connection/IpConnectionList.h"
+#include "ip/ipsec/IpIpsecSAAdd.h"
+#include "ip/ipsec/IpIpsecSAList.h"
+#include "ip/ipsec/IpIpsecSARemove.h"
+#include "ip/ipsec/IpIpsecSPAdd.h"
+#include "ip/ipsec/IpIpsecSPList.h"
+#include "ip/ipsec/IpIpsecSPRemove.h"
+#include "ip/ipsec/IpIpsecSet.h"
+#include "ip/neighbor/IpNeighborList.h"
+#include "ip/neighbor/IpNeighborRemove.h"
 #include "nic/NicCoalesceGet.h"
 #include "nic/NicCoalesceSet.h"
 #include "nic/NicCsoGet.h"
@@ -121,11 +131,11 @@ extern "C" __attribute__((visibility("default"))) void AutoCli_RegisterNamespace
                "Operations having to do with the creation, management and deletion of Pallad Netstack Instances.");
 
     // network ip neighbor
-    // list: IpNeighborList
-    // remove: IpNeighborRemove
+    ipNeighbor->RegisterNamespaceNode(IpNeighborList::New(), "list");
+    ipNeighbor->RegisterNamespaceNode(IpNeighborRemove::New(), "remove");
 
     // network ip connection
-    // list: IpConnectionList
+    ipConnection->RegisterNamespaceNode(IpConnectionList::New(), "list");
 
     // network ip dns
     auto ipDnsServer = Attach(ipDns, "server", "Operations pertaining to DNS server configuration.");
@@ -156,19 +166,19 @@ extern "C" __attribute__((visibility("default"))) void AutoCli_RegisterNamespace
     // list: IpRouteIpv6List
 
     // network ip ipsec
-    // set: IpIpsecSet
+    ipIpsec->RegisterNamespaceNode(IpIpsecSet::New(), "set");
     auto ipIpsecSa = Attach(ipIpsec, "sa", "Operations pertaining to Security Association");
     auto ipIpsecSp = Attach(ipIpsec, "sp", "Operations pertaining to Security Policy");
 
     // network ip ipsec sa
-    // add: IpIpsecSAAdd
-    // remove: IpIpsecSARemove
-    // list: IpIpsecSAList
+    ipIpsecSa->RegisterNamespaceNode(IpIpsecSAAdd::New(), "add");
+    ipIpsecSa->RegisterNamespaceNode(IpIpsecSARemove::New(), "remove");
+    ipIpsecSa->RegisterNamespaceNode(IpIpsecSAList::New(), "list");
 
     // network ip ipsec sp
-    // add: IpIpsecSPAdd
-    // remove: IpIpsecSPRemove
-    // list: IpIpsecSPList
+    ipIpsecSp->RegisterNamespaceNode(IpIpsecSPAdd::New(), "add");
+    ipIpsecSp->RegisterNamespaceNode(IpIpsecSPRemove::New(), "remove");
+    ipIpsecSp->RegisterNamespaceNode(IpIpsecSPList::New(), "list");
 
     // network ip interface
     // add: IpInterfaceAdd
