@@ -1,6 +1,7 @@
 // Writes a large host profile on stdout, for the benchmark: about 1000
 // standard switches with 4096 ports in all, 2000 port groups, 256 kernel
-// interfaces over 16 netstacks, 10000 routes and 64 NICs with their driver data.
+// interfaces over 16 netstacks, 10000 routes, 2000 neighbors, 5000
+// connections of 64 worlds and 64 NICs with their driver data.
 // Deterministic: the same profile every time.
 #include <cstdint>
 #include <cstdio>
@@ -19,6 +20,11 @@ constexpr int kPortGroupsPerSwitch = 2;
 constexpr int kInterfaces = 256;
 constexpr int kNetstacks = 16;
 constexpr int kRoutes = 10000;
+// Of the routes, IPv4 ones (the rest are IPv6).
+constexpr int kIpv4Routes = 8000;
+constexpr int kNeighbors = 2000;
+constexpr int kConnections = 5000;
+constexpr int kWorlds = 64;
 constexpr int kNics = 64;
 constexpr long long kPortBlock = 1LL << 24;
 
@@ -215,16 +221,24 @@ int main() {
                               {"portgroup", sw + "-pg0"}});
     }
 
-    // IPv4 host routes through the three documentation ranges, then IPv6
-    // /48 routes under 2001:db8::/32 for the rest.
+    // The default netstack's table: its default route, then IPv4 host routes
+    // through the three documentation ranges, each network via several
+    // gateways of pld0's network (as a multipath route is stored), then
+    // IPv6 /48 routes under 2001:db8::/32.
     Json routes = Json::array();
+    routes.push_back({{"netstack", "defaultTcpipStack"},
+                      {"network", "0.0.0.0/0"},
+                      {"gateway", "198.51.100.254"},
+                      {"interface", "pld0"}});
     const char* const v4Ranges[] = {"192.0.2.", "198.51.100.", "203.0.113."};
-    for (int r = 0; r < kRoutes; ++r) {
-        if (r < 3 * 256) {
+    for (int r = 1; r < kRoutes; ++r) {
+        if (r < kIpv4Routes) {
+            const int host = r % (3 * 256);
             routes.push_back({{"netstack", "defaultTcpipStack"},
-                              {"network", std::string(v4Ranges[r / 256]) + std::to_string(r % 256) + "/32"},
-                              {"gateway", "192.0.2.1"},
-                              {"interface", "pld0"}});
+                              {"network", std::string(v4Ranges[host / 256]) + std::to_string(host % 256) + "/32"},
+                              {"gateway", "198.51.100." + std::to_string(2 + r / (3 * 256))},
+                              {"interface", "pld0"},
+                              {"source", r % 7 == 0 ? "DHCP" : "MANUAL"}});
         } else {
             char network[40];
             std::snprintf(network, sizeof network, "2001:db8:%x::/48", r);
@@ -235,12 +249,75 @@ int main() {
         }
     }
 
+    // Neighbors on the default netstack's interfaces (pld0, pld16, ...),
+    // half of each family, every type and state in turn.
+    const char* const ipv4Types[] = {"Dynamic", "Static", "Local"};
+    const char* const ipv6Types[] = {"Dynamic", "Static", "Local", "Router"};
+    const char* const ipv6States[] = {"Incomplete", "Reachable", "Stale", "Delay", "Probe"};
+    Json neighbors = Json::array();
+    for (int n = 0; n < kNeighbors; ++n) {
+        const int slot = n / (kInterfaces / kNetstacks);
+        Json neighbor = {{"netstack", "defaultTcpipStack"},
+                         {"interface", "pld" + std::to_string((n % (kInterfaces / kNetstacks)) * kNetstacks)},
+                         {"mac", Mac(0xc0, n)},
+                         {"expiry", n % 1200}};
+        if (n < kNeighbors / 2) {
+            neighbor["address"] = std::string(v4Ranges[slot / 254]) + std::to_string(slot % 254 + 1);
+            neighbor["type"] = ipv4Types[n % 3];
+        } else {
+            char address[40];
+            std::snprintf(address, sizeof address, "2001:db8:ff::%x", slot + 1);
+            neighbor["address"] = address;
+            neighbor["type"] = ipv6Types[n % 4];
+            neighbor["state"] = ipv6States[n % 5];
+        }
+        neighbors.push_back(neighbor);
+    }
+
+    // Worlds, and the default netstack's endpoints they own: TCP in every
+    // state, UDP and raw IP.
+    Json worlds = Json::array();
+    for (int w = 0; w < kWorlds; ++w) {
+        worlds.push_back({{"id", 2000000 + w}, {"name", "bench-world-" + std::to_string(w)}, {"kind", "host"}});
+    }
+    const char* const tcpStates[] = {"CLOSED",     "LISTEN",  "SYN_SENT", "RCVD",       "ESTABLISHED", "CLOSE_WAIT",
+                                     "FIN_WAIT_1", "CLOSING", "LAST_ACK", "FIN_WAIT_2", "TIME_WAIT"};
+    Json connections = Json::array();
+    for (int c = 0; c < kConnections; ++c) {
+        Json connection = {{"netstack", "defaultTcpipStack"}, {"worldId", 2000000 + c % kWorlds}};
+        if (c < kConnections * 3 / 5) {
+            connection.update({{"proto", "tcp"},
+                               {"localAddress", "198.51.100.1"},
+                               {"localPort", 1024 + c},
+                               {"foreignAddress", "203.0.113." + std::to_string(c % 254 + 1)},
+                               {"foreignPort", 40000 + c % 20000},
+                               {"state", tcpStates[c % 11]},
+                               {"ccAlgorithm", c % 2 ? "cubic" : "newreno"}});
+        } else if (c < kConnections * 9 / 10) {
+            connection.update({{"proto", "udp"},
+                               {"localAddress", "198.51.100.1"},
+                               {"localPort", 10000 + c},
+                               {"foreignAddress", "0.0.0.0"},
+                               {"foreignPort", 0}});
+        } else {
+            connection.update({{"proto", "ip"},
+                               {"localAddress", "192.0.2." + std::to_string(c % 254 + 1)},
+                               {"localPort", 0},
+                               {"foreignAddress", "203.0.113." + std::to_string(c / 254 % 254 + 1)},
+                               {"foreignPort", 0}});
+        }
+        connections.push_back(connection);
+    }
+
     profile["nics"] = nics;
     profile["vswitches"] = vswitches;
     profile["portgroups"] = portgroups;
     profile["netstacks"] = netstacks;
     profile["interfaces"] = interfaces;
     profile["routes"] = routes;
+    profile["neighbors"] = neighbors;
+    profile["connections"] = connections;
+    profile["worlds"] = worlds;
     profile["ports"] = ports;
     std::cout << profile.dump(1) << "\n";
     return 0;

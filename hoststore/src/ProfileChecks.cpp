@@ -8,6 +8,10 @@
 // library), which is why the table lives here rather than beside them.
 #include "ProfileChecks.h"
 
+#include <arpa/inet.h>
+#include <netinet/in.h>
+
+#include <algorithm>
 #include <cctype>
 #include <cmath>
 #include <cstdint>
@@ -33,7 +37,22 @@ using FieldChecks = std::vector<FieldCheck>;
 // written with a fraction or an exponent counts as that integer, as the
 // library reads it so.
 struct FieldCheck {
-    enum class Kind { String, Bool, Integer, Word, StringList, WordList, IntegerList, Object, ObjectList, HexBytes };
+    enum class Kind {
+        String,
+        Bool,
+        Integer,
+        Word,
+        StringList,
+        WordList,
+        IntegerList,
+        Object,
+        ObjectList,
+        HexBytes,
+        Address,
+        Network,
+        AddressList,
+        SingleWordList,
+    };
 
     const char* name;
     Kind kind;
@@ -41,6 +60,10 @@ struct FieldCheck {
     std::uint64_t max = 0;
     std::vector<const char*> words = {};
     const FieldChecks* fields = nullptr;
+    // Addresses and networks: 4 or 6, or 0 for either family; whether ""
+    // stands for none.
+    int family = 0;
+    bool emptyAllowed = false;
 };
 
 FieldCheck Text(const char* name) {
@@ -73,6 +96,22 @@ FieldCheck NestedList(const char* name, const FieldChecks& fields) {
 // A string of hex digit pairs, one pair a byte.
 FieldCheck Bytes(const char* name) {
     return {name, FieldCheck::Kind::HexBytes};
+}
+
+// Canonical address text (as the library writes it and compares keys).
+FieldCheck Address(const char* name, int family, bool emptyAllowed = false) {
+    return {name, FieldCheck::Kind::Address, 0, 0, {}, nullptr, family, emptyAllowed};
+}
+// address/prefix in canonical text, no host bits set.
+FieldCheck Network(const char* name, int family) {
+    return {name, FieldCheck::Kind::Network, 0, 0, {}, nullptr, family};
+}
+FieldCheck Addresses(const char* name) {
+    return {name, FieldCheck::Kind::AddressList};
+}
+// Names shown joined by blanks: no blank or control character inside.
+FieldCheck SingleWords(const char* name) {
+    return {name, FieldCheck::Kind::SingleWordList};
 }
 
 // The policies a switch holds whole and a port group in part.
@@ -258,6 +297,10 @@ const FieldChecks kNetstack = {
     Text("ccAlgorithm"),
     Flag("ipv6Enabled"),
     Flag("currentIpv6Enabled"),
+    Address("ipv4Gateway", 4, true),
+    Address("ipv6Gateway", 6, true),
+    Addresses("dnsServers"),
+    SingleWords("searchDomains"),
 };
 const FieldChecks kIpv6Address = {
     Text("address"),
@@ -289,6 +332,63 @@ const FieldChecks kInterface = {
     Words("tags", {"Management", "LiveMigration", "FaultTolerance", "Backup", "Replication", "Provisioning", "Storage",
                    "Telemetry"}),
 };
+const FieldChecks kRoute = {
+    Text("netstack"), Network("network", 0), Address("gateway", 0), Text("interface"), Text("source"),
+};
+constexpr std::int64_t kInt32Min = std::numeric_limits<std::int32_t>::min();
+const FieldChecks kNeighbor = {
+    Text("netstack"),
+    Text("interface"),
+    Address("address", 0),
+    Text("mac"),
+    // IPv4 entries count signed, IPv6 entries unsigned 32-bit seconds.
+    Integer("expiry", kInt32Min, kUint32Max),
+    Word("type", {"Dynamic", "Static", "Local", "Router"}),
+    Word("state", {"Incomplete", "Reachable", "Stale", "Delay", "Probe"}),
+};
+// A TCP state is any text: one the library has no word for shows as empty.
+const FieldChecks kConnection = {
+    Text("netstack"),
+    Word("proto", {"tcp", "udp", "ip"}),
+    Address("localAddress", 0),
+    Integer("localPort", 0, 65535),
+    Address("foreignAddress", 0),
+    Integer("foreignPort", 0, 65535),
+    Integer("recvQ", 0, kUint32Max),
+    Integer("sendQ", 0, kUint32Max),
+    Text("state"),
+    Integer("worldId", 0, kUint32Max),
+    Text("ccAlgorithm"),
+};
+const FieldChecks kWorld = {Integer("id", 0, kUint32Max), Text("name"), Word("kind", {"vm", "host"})};
+const FieldChecks kIpsec = {Text("ikeConfigPath"), Text("ikeConfig"), Text("ikeConfigSource"),
+                            Flag("ikeDaemonsRunning")};
+const FieldChecks kSa = {
+    Text("name"),
+    Flag("auto"),
+    Address("source", 6),
+    Address("destination", 6),
+    Integer("spi", 0, kUint32Max),
+    Word("mode", {"any", "transport", "tunnel"}),
+    Word("encryptionAlgorithm", {"null", "3des-cbc", "aes128-cbc"}),
+    Text("encryptionKey"),
+    Word("integrityAlgorithm", {"hmac-sha1", "hmac-sha2-256"}),
+    Text("integrityKey"),
+    Word("state", {"larval", "mature", "dying", "dead"}),
+    Integer("lifetime", 0, kUint64Max),
+};
+const FieldChecks kSp = {
+    Text("name"),
+    Text("saName"),
+    Network("source", 6),
+    Network("destination", 6),
+    Integer("sourcePort", 0, 65535),
+    Integer("destinationPort", 0, 65535),
+    Word("protocol", {"any", "tcp", "udp", "icmp6"}),
+    Word("direction", {"in", "out"}),
+    Word("action", {"none", "discard", "ipsec"}),
+    Word("mode", {"any", "transport", "tunnel"}),
+};
 const FieldChecks kExec = {Text("command"), Integer("exitStatus", 0, 255)};
 
 const FieldChecks* ChecksOf(const std::string& section) {
@@ -303,11 +403,78 @@ const FieldChecks* ChecksOf(const std::string& section) {
         {Section::kNetstacks, &kNetstack},
         {Section::kInterfaces, &kInterface},
         {Section::kExecLog, &kExec},
+        {Section::kRoutes, &kRoute},
+        {Section::kNeighbors, &kNeighbor},
+        {Section::kConnections, &kConnection},
+        {Section::kWorlds, &kWorld},
+        {Section::kIpsec, &kIpsec},
+        {Section::kIpsecSAs, &kSa},
+        {Section::kIpsecSPs, &kSp},
     };
     for (const auto& [name, checks] : sections) {
         if (section == name) return checks;
     }
     return nullptr;
+}
+
+// The family (4 or 6) of canonical address text, or 0 for text that is no
+// address or not written as the library writes it.
+int CanonicalFamily(const std::string& text) {
+    for (const int family : {AF_INET, AF_INET6}) {
+        unsigned char bytes[sizeof(in6_addr)];
+        char back[INET6_ADDRSTRLEN];
+        if (inet_pton(family, text.c_str(), bytes) == 1 && inet_ntop(family, bytes, back, sizeof back) &&
+            text == back) {
+            return family == AF_INET ? 4 : 6;
+        }
+    }
+    return 0;
+}
+
+std::string FamilyWords(int family) {
+    return family == 4 ? "an IPv4 address" : family == 6 ? "an IPv6 address" : "an IP address";
+}
+
+std::string AddressMismatch(const FieldCheck& check, const Json& value) {
+    const std::string wanted =
+        FamilyWords(check.family) + " in canonical text" + (check.emptyAllowed ? " or \"\"" : "");
+    if (!value.is_string()) return "must be " + wanted + ", not " + value.type_name();
+    const std::string& text = value.get_ref<const std::string&>();
+    if (text.empty() && check.emptyAllowed) return "";
+    const int family = CanonicalFamily(text);
+    if (family != 0 && (check.family == 0 || check.family == family)) return "";
+    return "must be " + wanted + ", not '" + text + "'";
+}
+
+// address/prefix with a canonical address, a decimal prefix within the
+// family's length and no host bits set.
+std::string NetworkMismatch(const FieldCheck& check, const Json& value) {
+    const std::string wanted = (check.family == 4   ? "an IPv4"
+                                : check.family == 6 ? "an IPv6"
+                                                    : "an IP") +
+                               std::string(" network address/prefix");
+    if (!value.is_string()) return "must be " + wanted + ", not " + value.type_name();
+    const std::string& text = value.get_ref<const std::string&>();
+    const std::string why = "must be " + wanted + " in canonical text with no host bits set, not '" + text + "'";
+    const auto slash = text.find('/');
+    if (slash == std::string::npos) return why;
+    const std::string address = text.substr(0, slash);
+    const std::string prefix = text.substr(slash + 1);
+    const int family = CanonicalFamily(address);
+    if (family == 0 || (check.family != 0 && check.family != family)) return why;
+    if (prefix.empty() || prefix.size() > 3 || (prefix.size() > 1 && prefix[0] == '0') ||
+        !std::all_of(prefix.begin(), prefix.end(), [](char c) { return c >= '0' && c <= '9'; })) {
+        return why;
+    }
+    const int length = std::stoi(prefix);
+    const int bits = family == 4 ? 32 : 128;
+    if (length > bits) return why;
+    unsigned char bytes[sizeof(in6_addr)] = {};
+    inet_pton(family == 4 ? AF_INET : AF_INET6, address.c_str(), bytes);
+    for (int bit = length; bit < bits; ++bit) {
+        if (bytes[bit / 8] & (0x80 >> (bit % 8))) return why;
+    }
+    return "";
 }
 
 bool IsWhole(const Json& value, std::int64_t min, std::uint64_t max) {
@@ -356,6 +523,26 @@ void CheckJoinedKey(const std::string& section, const Json& object, const std::s
             value->get_ref<const std::string&>().find('|') != std::string::npos) {
             throw ProfileError(where + "." + field + ": must not contain '|', which joins the fields of a key");
         }
+    }
+}
+
+bool IsSingleWord(const std::string& text) {
+    return !text.empty() && std::none_of(text.begin(), text.end(), [](char c) {
+        const auto byte = static_cast<unsigned char>(c);
+        return byte <= ' ' || byte == 0x7f;
+    });
+}
+
+// A route's gateway is of its network's family.
+void CheckRouteFamilies(const Json& route, const std::string& where) {
+    const auto network = route.find("network");
+    const auto gateway = route.find("gateway");
+    if (network == route.end() || gateway == route.end() || !network->is_string() || !gateway->is_string()) return;
+    const bool ipv6Network = network->get_ref<const std::string&>().find(':') != std::string::npos;
+    const bool ipv6Gateway = gateway->get_ref<const std::string&>().find(':') != std::string::npos;
+    if (ipv6Network != ipv6Gateway) {
+        throw ProfileError(where + ".gateway: must be an " + (ipv6Network ? "IPv6" : "IPv4") +
+                           " address like its network, not '" + gateway->get<std::string>() + "'");
     }
 }
 
@@ -425,6 +612,26 @@ std::string Mismatch(const FieldCheck& check, const Json& value, const std::stri
                 CheckFields(*check.fields, value[i], item);
             }
             return "";
+        case FieldCheck::Kind::Address:
+            return AddressMismatch(check, value);
+        case FieldCheck::Kind::Network:
+            return NetworkMismatch(check, value);
+        case FieldCheck::Kind::AddressList:
+        case FieldCheck::Kind::SingleWordList:
+            if (!value.is_array()) return "must be an array of strings" + found;
+            for (std::size_t i = 0; i < value.size(); ++i) {
+                std::string why;
+                if (check.kind == FieldCheck::Kind::AddressList) {
+                    why = AddressMismatch(check, value[i]);
+                } else if (!value[i].is_string()) {
+                    why = std::string("must be a string, not ") + value[i].type_name();
+                } else if (!IsSingleWord(value[i].get_ref<const std::string&>())) {
+                    why = "must be a name without blanks or control characters, not '" + value[i].get<std::string>() +
+                          "'";
+                }
+                if (!why.empty()) return "item " + std::to_string(i) + " " + why;
+            }
+            return "";
         case FieldCheck::Kind::HexBytes: {
             if (!value.is_string()) return "must be a string of hex digit pairs" + found;
             const std::string& text = value.get_ref<const std::string&>();
@@ -454,6 +661,7 @@ void CheckSectionFields(const std::string& section, const Json& value) {
         if (!value[i].is_object()) continue;
         CheckJoinedKey(section, value[i], where);
         if (checks) CheckFields(*checks, value[i], where);
+        if (section == Section::kRoutes) CheckRouteFamilies(value[i], where);
     }
 }
 

@@ -54,6 +54,26 @@ int InterfaceNumber(const std::string& name) {
     return number <= kMaxInterfaceNumber ? number : -1;
 }
 
+std::string JoinedKey(std::initializer_list<std::string> parts) {
+    std::string key;
+    bool first = true;
+    for (const std::string& part : parts) {
+        if (!first) key += '|';
+        key += part;
+        first = false;
+    }
+    return key;
+}
+
+bool IsSingleWord(const std::string& text) {
+    if (text.empty()) return false;
+    for (const char c : text) {
+        const auto byte = static_cast<unsigned char>(c);
+        if (byte <= ' ' || byte == 0x7f) return false;
+    }
+    return true;
+}
+
 std::string MissingInterfaceMessage(const std::string& name) {
     return "Interface " + name + " does not exist";
 }

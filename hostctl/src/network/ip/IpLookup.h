@@ -5,6 +5,7 @@
 #pragma once
 
 #include <cstdint>
+#include <initializer_list>
 #include <memory>
 #include <string>
 
@@ -20,6 +21,15 @@ namespace Detail {
 inline constexpr int kMaxInterfaceNumber = 255;
 // The number of an interface name pld0 to pld255 (no leading zeros), or -1.
 int InterfaceNumber(const std::string& name);
+
+// The key the store gives an object of a collection keyed by several fields:
+// the fields joined by '|'.
+std::string JoinedKey(std::initializer_list<std::string> parts);
+
+// Whether a name a user gives (a search domain, an SA or SP name) can be
+// stored and shown as one word on one line: not empty, no blank, no control
+// character.
+bool IsSingleWord(const std::string& text);
 
 std::string MissingInterfaceMessage(const std::string& name);
 std::string MissingNetstackMessage(const std::string& key);

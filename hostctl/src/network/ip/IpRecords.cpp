@@ -56,7 +56,55 @@ struct RecordFields<NetstackRecord> {
             Field("currentMaxConnections", &NetstackRecord::currentMaxConnections),
             Field("ccAlgorithm", &NetstackRecord::ccAlgorithm),
             Field("ipv6Enabled", &NetstackRecord::ipv6Enabled),
-            Field("currentIpv6Enabled", &NetstackRecord::currentIpv6Enabled));
+            Field("currentIpv6Enabled", &NetstackRecord::currentIpv6Enabled),
+            Field("ipv4Gateway", &NetstackRecord::ipv4Gateway),
+            Field("ipv6Gateway", &NetstackRecord::ipv6Gateway),
+            Field("dnsServers", &NetstackRecord::dnsServers),
+            Field("searchDomains", &NetstackRecord::searchDomains));
+    }
+};
+
+template <>
+struct RecordFields<RouteRecord> {
+    static constexpr auto All() {
+        return std::make_tuple(
+            Field("netstack", &RouteRecord::netstack),
+            Field("network", &RouteRecord::network),
+            Field("gateway", &RouteRecord::gateway),
+            Field("interface", &RouteRecord::interfaceName),
+            Field("source", &RouteRecord::source));
+    }
+};
+
+template <>
+struct RecordFields<NeighborRecord> {
+    static constexpr auto All() {
+        return std::make_tuple(
+            Field("netstack", &NeighborRecord::netstack),
+            Field("interface", &NeighborRecord::interfaceName),
+            Field("address", &NeighborRecord::address),
+            Field("mac", &NeighborRecord::mac),
+            Field("expiry", &NeighborRecord::expiry),
+            Field("type", &NeighborRecord::type),
+            Field("state", &NeighborRecord::state));
+    }
+};
+
+template <>
+struct RecordFields<ConnectionRecord> {
+    static constexpr auto All() {
+        return std::make_tuple(
+            Field("netstack", &ConnectionRecord::netstack),
+            Field("proto", &ConnectionRecord::proto),
+            Field("localAddress", &ConnectionRecord::localAddress),
+            Field("localPort", &ConnectionRecord::localPort),
+            Field("foreignAddress", &ConnectionRecord::foreignAddress),
+            Field("foreignPort", &ConnectionRecord::foreignPort),
+            Field("recvQ", &ConnectionRecord::recvQ),
+            Field("sendQ", &ConnectionRecord::sendQ),
+            Field("state", &ConnectionRecord::state),
+            Field("worldId", &ConnectionRecord::worldId),
+            Field("ccAlgorithm", &ConnectionRecord::ccAlgorithm));
     }
 };
 // clang-format on
@@ -66,3 +114,6 @@ struct RecordFields<NetstackRecord> {
 
 STORED_RECORD(PldCtl::Detail::InterfaceRecord);
 STORED_RECORD(PldCtl::Detail::NetstackRecord);
+STORED_RECORD(PldCtl::Detail::RouteRecord);
+STORED_RECORD(PldCtl::Detail::NeighborRecord);
+STORED_RECORD(PldCtl::Detail::ConnectionRecord);

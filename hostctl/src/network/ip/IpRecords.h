@@ -65,6 +65,13 @@ struct NetstackRecord {
     std::string ccAlgorithm = "newreno";
     bool ipv6Enabled = true;
     std::optional<bool> currentIpv6Enabled;
+    // The configured default gateways, canonical address text; "" for none.
+    std::string ipv4Gateway;
+    std::string ipv6Gateway;
+    // The resolver's servers (canonical address text) and search domains,
+    // each in the order they are used.
+    std::vector<std::string> dnsServers;
+    std::vector<std::string> searchDomains;
 
     std::string DisplayName() const { return name ? *name : key; }
     bool InKernel() const { return state == HostCtl::Network::NetstackInstance::STATE_IN_KERNEL; }
@@ -72,6 +79,55 @@ struct NetstackRecord {
         return currentMaxConnections ? *currentMaxConnections : (InKernel() ? maxConnections : 0);
     }
     bool CurrentIpv6Enabled() const { return currentIpv6Enabled ? *currentIpv6Enabled : (InKernel() && ipv6Enabled); }
+};
+
+// One route of a netstack; both families share the collection and the
+// network text tells them apart (':' means IPv6). Network and gateway are
+// canonical text, as the key joins them.
+struct RouteRecord {
+    static constexpr const char* kSection = Store::Section::kRoutes;
+
+    std::string netstack;
+    std::string network;
+    std::string gateway;
+    std::string interfaceName;
+    std::string source = "MANUAL";
+
+    bool IsIpv6() const { return network.find(':') != std::string::npos; }
+};
+
+// One neighbor cache entry; the family is the address's.
+struct NeighborRecord {
+    static constexpr const char* kSection = Store::Section::kNeighbors;
+
+    std::string netstack;
+    std::string interfaceName;
+    std::string address;
+    std::string mac;
+    std::int64_t expiry = 0;
+    std::string type = "Dynamic";
+    // IPv6 only; unset reads as "Reachable".
+    std::optional<std::string> state;
+
+    bool IsIpv6() const { return address.find(':') != std::string::npos; }
+};
+
+// One open endpoint: `proto` is "tcp", "udp" or "ip"; `state` a TCP state
+// word ("" for UDP and raw IP).
+struct ConnectionRecord {
+    static constexpr const char* kSection = Store::Section::kConnections;
+
+    std::string netstack;
+    std::string proto;
+    std::string localAddress = "0.0.0.0";
+    std::int64_t localPort = 0;
+    std::string foreignAddress = "0.0.0.0";
+    std::int64_t foreignPort = 0;
+    std::uint32_t recvQ = 0;
+    std::uint32_t sendQ = 0;
+    std::string state;
+    std::uint32_t worldId = 0;
+    std::string ccAlgorithm;
 };
 
 }  // namespace Detail

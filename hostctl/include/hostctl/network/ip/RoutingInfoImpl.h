@@ -2,6 +2,7 @@
 #pragma once
 
 #include <cstdint>
+#include <memory>
 #include <string>
 #include <vector>
 
@@ -50,6 +51,10 @@ struct Ipv6Neighbor {
 }  // namespace HostCtl
 
 namespace PldCtl {
+namespace Detail {
+struct RouteSources;
+}  // namespace Detail
+
 namespace Network {
 
 // Made for a netstack instance it never throws; the operations throw
@@ -117,6 +122,10 @@ public:
 
 private:
     std::string netstack_;
+    // The sources of the routes the last IPv4 listing returned, which
+    // GetDefaultGatewaySource answers from while this object changes nothing:
+    // a listing asks for the source of each of its routes.
+    std::shared_ptr<Detail::RouteSources> sources_;
 };
 
 }  // namespace Network
