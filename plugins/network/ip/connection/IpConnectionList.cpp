@@ -62,33 +62,36 @@ void IpConnectionList::ExecuteInternal(boost::shared_ptr<CallSpec::Input> input,
     const std::string type = input->IsSet("type") ? input->GetString("type") : std::string("all");
     PldCtl::Network::NetworkInfoImpl networkInfo;
     PldCtl::Resource::ResourceInfoImpl resources;
-    ReportingHostErrors(
-        output,
-        [&] {
-            boost::shared_ptr<MetaObj::MetaList> records =
-                MetaObj::MetaList::New(MetaObj::META_STRUCT, GetOutputStructure());
-            for (const Protocol& protocol : kProtocols) {
-                if (type != "all" && type != protocol.word) continue;
-                std::vector<HostCtl::Network::TcpIpConnection> connections;
-                (networkInfo.*protocol.table)(connections, netstack);
-                for (const HostCtl::Network::TcpIpConnection& connection : connections) {
-                    boost::shared_ptr<MetaObj::MetaStruct> record = GetOutputStructure();
-                    record->SetField("Proto", protocol.word);
-                    record->SetField("Recv Q", connection.recvQueue);
-                    record->SetField("Send Q", connection.sendQueue);
-                    record->SetField("Local Address", EndpointText(connection.localAddress, connection.localPort));
-                    record->SetField("Foreign Address",
-                                     EndpointText(connection.foreignAddress, connection.foreignPort));
-                    record->SetField("State", TcpStateWord(connection.state));
-                    record->SetField("World ID", connection.worldId);
-                    record->SetField("CC Algo", connection.ccAlgorithm);
-                    record->SetField("World Name", resources.GetWorldName(connection.worldId));
-                    records->Append(std::move(record));
-                }
+    // The sentence and the library's message are two lines; each is its own
+    // message, because the runner shows control characters inside a message
+    // escaped.
+    try {
+        boost::shared_ptr<MetaObj::MetaList> records =
+            MetaObj::MetaList::New(MetaObj::META_STRUCT, GetOutputStructure());
+        for (const Protocol& protocol : kProtocols) {
+            if (type != "all" && type != protocol.word) continue;
+            std::vector<HostCtl::Network::TcpIpConnection> connections;
+            (networkInfo.*protocol.table)(connections, netstack);
+            for (const HostCtl::Network::TcpIpConnection& connection : connections) {
+                boost::shared_ptr<MetaObj::MetaStruct> record = GetOutputStructure();
+                record->SetField("Proto", protocol.word);
+                record->SetField("Recv Q", connection.recvQueue);
+                record->SetField("Send Q", connection.sendQueue);
+                record->SetField("Local Address", EndpointText(connection.localAddress, connection.localPort));
+                record->SetField("Foreign Address",
+                                 EndpointText(connection.foreignAddress, connection.foreignPort));
+                record->SetField("State", TcpStateWord(connection.state));
+                record->SetField("World ID", connection.worldId);
+                record->SetField("CC Algo", connection.ccAlgorithm);
+                record->SetField("World Name", resources.GetWorldName(connection.worldId));
+                records->Append(std::move(record));
             }
-            Finish(output, records);
-        },
-        "Unable to get connection list.\n");
+        }
+        Finish(output, records);
+    } catch (const HostCtl::Lib::HostCtlException& e) {
+        output->SetError("Unable to get connection list.");
+        output->SetError(e.GetMessage(0));
+    }
 }
 
 }  // namespace NetworkNamespace

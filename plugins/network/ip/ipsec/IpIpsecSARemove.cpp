@@ -17,12 +17,16 @@ const char* const kSource = "sa-source";
 const char* const kDestination = "sa-destination";
 const char* const kSpi = "sa-spi";
 
-const char* const kWhichOperation =
-    "Can not figure out which operation you want to perform.\n"
-    "Remove a unique SA: Only specify the '--sa-name' option to remove a normal SA.\n"
+// The explanation of the three forms, a message a line: the runner shows
+// control characters inside a message escaped, so a line break has to be the
+// end of a message.
+const char* const kWhichOperation[] = {
+    "Can not figure out which operation you want to perform.",
+    "Remove a unique SA: Only specify the '--sa-name' option to remove a normal SA.",
     "Remove an auto SA: Set the '--sa-name' to 'auto'. You should also specify '--sa-source', '--sa-destination' and "
-    "'--sa-spi' and omit '--remove-all' when removing an auto SA.\n"
-    "Remove all SAs: You should only set the flag '--remove-all' to remove all SAs.";
+    "'--sa-spi' and omit '--remove-all' when removing an auto SA.",
+    "Remove all SAs: You should only set the flag '--remove-all' to remove all SAs.",
+};
 
 }  // namespace
 
@@ -83,7 +87,7 @@ void IpIpsecSARemove::ExecuteInternal(boost::shared_ptr<CallSpec::Input> input,
         } else if (removeAll && !named && !anyEnd) {
             config.FlushSADConfig();
         } else {
-            output->SetError(kWhichOperation);
+            for (const char* line : kWhichOperation) output->SetError(line);
             return;
         }
         FinishTrue(output);
