@@ -86,8 +86,10 @@ TEST(ReadPort, AcceptsTheWholeRangeAndRefusesEachSideOfIt) {
     input->SetInt("destination-port", "4294967376", 4294967376LL);
     EXPECT_FALSE(ReadPort(*input, "destination-port", *output));
     ASSERT_EQ(output->GetErrors().size(), 3u);
-    EXPECT_EQ(output->GetErrors()[0], "Check the input value for '--source-port'. Should be in range 0-65535. Got 65536");
-    EXPECT_EQ(output->GetErrors()[1], "Check the input value for '--destination-port'. Should be in range 0-65535. Got -1");
+    EXPECT_EQ(output->GetErrors()[0],
+              "Check the input value for '--source-port'. Should be in range 0-65535. Got 65536");
+    EXPECT_EQ(output->GetErrors()[1],
+              "Check the input value for '--destination-port'. Should be in range 0-65535. Got -1");
     EXPECT_EQ(output->GetErrors()[2],
               "Check the input value for '--destination-port'. Should be in range 0-65535. Got 4294967376");
 }

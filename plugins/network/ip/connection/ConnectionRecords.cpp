@@ -7,9 +7,9 @@ namespace NetworkNamespace {
 
 namespace {
 
-const std::array<const char*, 11> kTcpStates = {"CLOSED",     "LISTEN",     "SYN_SENT", "RCVD",
+const std::array<const char*, 11> kTcpStates = {"CLOSED",      "LISTEN",     "SYN_SENT",   "RCVD",
                                                 "ESTABLISHED", "CLOSE_WAIT", "FIN_WAIT_1", "CLOSING",
-                                                "LAST_ACK",   "FIN_WAIT_2", "TIME_WAIT"};
+                                                "LAST_ACK",    "FIN_WAIT_2", "TIME_WAIT"};
 
 }  // namespace
 

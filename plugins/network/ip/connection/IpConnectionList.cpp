@@ -14,7 +14,7 @@ namespace NetworkNamespace {
 namespace {
 
 using ConnectionTable = void (PldCtl::Network::NetworkInfoImpl::*)(std::vector<HostCtl::Network::TcpIpConnection>&,
-                                                                    const std::string&);
+                                                                   const std::string&);
 
 // The protocols in the order the list shows them, each with its table.
 struct Protocol {
@@ -33,9 +33,8 @@ IpConnectionList::IpConnectionList() {
     SetDescription("List active TCP/IP connections");
     SetMetaDataField("type", "fetcher");
     SetDefaultOutputFormatter("table");
-    SetDefaultOutputParameter(
-        "fields:IpConnection",
-        "Proto,Recv Q,Send Q,Local Address,Foreign Address,State,World ID,CC Algo,World Name");
+    SetDefaultOutputParameter("fields:IpConnection",
+                              "Proto,Recv Q,Send Q,Local Address,Foreign Address,State,World ID,CC Algo,World Name");
 }
 
 ORVIX_COMMAND_NEW(IpConnectionList)
@@ -78,8 +77,7 @@ void IpConnectionList::ExecuteInternal(boost::shared_ptr<CallSpec::Input> input,
                 record->SetField("Recv Q", connection.recvQueue);
                 record->SetField("Send Q", connection.sendQueue);
                 record->SetField("Local Address", EndpointText(connection.localAddress, connection.localPort));
-                record->SetField("Foreign Address",
-                                 EndpointText(connection.foreignAddress, connection.foreignPort));
+                record->SetField("Foreign Address", EndpointText(connection.foreignAddress, connection.foreignPort));
                 record->SetField("State", TcpStateWord(connection.state));
                 record->SetField("World ID", connection.worldId);
                 record->SetField("CC Algo", connection.ccAlgorithm);

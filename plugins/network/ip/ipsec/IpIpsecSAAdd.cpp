@@ -18,8 +18,8 @@ ORVIX_COMMAND_NEW(IpIpsecSAAdd)
 
 boost::shared_ptr<CallSpec::InputSpec> IpIpsecSAAdd::GetInputSpecInternal() {
     boost::shared_ptr<CallSpec::InputSpec> inputSpec = CallSpec::InputSpec::New();
-    DeclareParameter(inputSpec, "sa-name", CallSpec::PARAM_STRING, "n", "Name for the Security Association to be added.",
-                     Required::Yes);
+    DeclareParameter(inputSpec, "sa-name", CallSpec::PARAM_STRING, "n",
+                     "Name for the Security Association to be added.", Required::Yes);
     DeclareParameter(inputSpec, "sa-source", CallSpec::PARAM_STRING, "s",
                      "Ipv6 address of Security Association source. Can be specified as 'any' or a correct IPv6 "
                      "address.",
@@ -31,8 +31,8 @@ boost::shared_ptr<CallSpec::InputSpec> IpIpsecSAAdd::GetInputSpecInternal() {
     DeclareParameter(inputSpec, "sa-mode", CallSpec::PARAM_STRING, "m",
                      "Security Association mode. Should be one in set %ENUM%.", Required::No,
                      StringEnum({{"transport", ""}, {"tunnel", ""}}));
-    DeclareParameter(inputSpec, "sa-spi", CallSpec::PARAM_STRING, "p",
-                     "SPI value for the Security Association(hex).", Required::Yes);
+    DeclareParameter(inputSpec, "sa-spi", CallSpec::PARAM_STRING, "p", "SPI value for the Security Association(hex).",
+                     Required::Yes);
     DeclareParameter(inputSpec, "encryption-algorithm", CallSpec::PARAM_STRING, "e",
                      "Encryption algorithm for the Security Association. Should be one in set %ENUM%.", Required::Yes,
                      StringEnum({{"null", ""}, {"3des-cbc", ""}, {"aes128-cbc", ""}}));

@@ -48,7 +48,8 @@ void IpIpsecSAList::ExecuteInternal(boost::shared_ptr<CallSpec::Input>, boost::s
             record->SetField("State", DisplayWord(IpSecConfigImpl::SA_STATE, sa.state));
             record->SetField("SPI", SpiText(sa.spi));
             record->SetField("Mode", DisplayWord(IpSecConfigImpl::SA_MODE, sa.mode));
-            record->SetField("Encryption Algorithm", DisplayWord(IpSecConfigImpl::SA_ENCPT_ALG, sa.encryptionAlgorithm));
+            record->SetField("Encryption Algorithm",
+                             DisplayWord(IpSecConfigImpl::SA_ENCPT_ALG, sa.encryptionAlgorithm));
             record->SetField("Integrity Algorithm", DisplayWord(IpSecConfigImpl::SA_AUTH_ALG, sa.integrityAlgorithm));
             record->SetField("Lifetime", ConvertToHrsMinsAndSecs(sa.lifetime));
             records->Append(std::move(record));

@@ -26,8 +26,7 @@ boost::shared_ptr<CallSpec::OutputSpec> IpIpsecSet::GetOutputSpecInternal() {
     return OperationOutputSpec();
 }
 
-void IpIpsecSet::ExecuteInternal(boost::shared_ptr<CallSpec::Input> input,
-                                 boost::shared_ptr<CallSpec::Output> output) {
+void IpIpsecSet::ExecuteInternal(boost::shared_ptr<CallSpec::Input> input, boost::shared_ptr<CallSpec::Output> output) {
     const std::string path = input->GetString("ike-conf");
     ReportingHostErrors(output, [&] {
         PldCtl::Network::IpSecConfigImpl config;

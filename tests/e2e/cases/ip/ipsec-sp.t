@@ -66,6 +66,10 @@ $ orvixcli network ip ipsec sp add --sp-name sp-drop --sp-source 2001:db8:40::/6
 
 $ orvixcli network ip ipsec sp add -n sp-plain -s 2001:db8:50::1/128 -d 2001:db8:50::2/128 -p 80 -P 8080 -A none -u icmp6 -w out
 
+$ orvixcli network ip ipsec sp add -n sp-transport -s 2001:db8:60::/64 -d 2001:db8:61::/64 -p 22 -P 0 -A ipsec -m transport -u tcp -w out -a sa-web-out
+
+$ orvixcli network ip ipsec sp add -n sp-in-any -s any -d any -p 0 -P 0 -A ipsec -u any -w in
+
 $ orvixcli network ip ipsec sp add -n sp-defaults -s any -d any -p 0 -P 0
 
 $ orvixcli network ip ipsec sp list --formatter=simple
@@ -143,6 +147,28 @@ $ orvixcli network ip ipsec sp list --formatter=simple
    Protocol: icmp6
    Flow: out
    Action: none
+   Mode: any
+   SA Name: 
+
+   Name: sp-transport
+   Source Address: 2001:db8:60::/64
+   Source Port: 22
+   Destination Address: 2001:db8:61::/64
+   Destination Port: 0
+   Protocol: tcp
+   Flow: out
+   Action: ipsec
+   Mode: transport
+   SA Name: sa-web-out
+
+   Name: sp-in-any
+   Source Address: ::/0
+   Source Port: 0
+   Destination Address: ::/0
+   Destination Port: 0
+   Protocol: any
+   Flow: in
+   Action: ipsec
    Mode: any
    SA Name: 
 
@@ -279,6 +305,28 @@ $ orvixcli network ip ipsec sp list --formatter=simple
    Protocol: icmp6
    Flow: out
    Action: none
+   Mode: any
+   SA Name: 
+
+   Name: sp-transport
+   Source Address: 2001:db8:60::/64
+   Source Port: 22
+   Destination Address: 2001:db8:61::/64
+   Destination Port: 0
+   Protocol: tcp
+   Flow: out
+   Action: ipsec
+   Mode: transport
+   SA Name: sa-web-out
+
+   Name: sp-in-any
+   Source Address: ::/0
+   Source Port: 0
+   Destination Address: ::/0
+   Destination Port: 0
+   Protocol: any
+   Flow: in
+   Action: ipsec
    Mode: any
    SA Name: 
 
