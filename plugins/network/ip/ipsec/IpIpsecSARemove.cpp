@@ -23,8 +23,8 @@ const char* const kSpi = "sa-spi";
 const char* const kWhichOperation[] = {
     "Can not figure out which operation you want to perform.",
     "Remove a unique SA: Only specify the '--sa-name' option to remove a normal SA.",
-    "Remove an auto SA: Set the '--sa-name' to 'auto'. You should also specify '--sa-source', '--sa-destination' and "
-    "'--sa-spi' and omit '--remove-all' when removing an auto SA.",
+    ("Remove an auto SA: Set the '--sa-name' to 'auto'. You should also specify '--sa-source', '--sa-destination' and "
+     "'--sa-spi' and omit '--remove-all' when removing an auto SA."),
     "Remove all SAs: You should only set the flag '--remove-all' to remove all SAs.",
 };
 
