@@ -12,6 +12,7 @@
 #include "framework/AutoCli.h"
 #include "ip/IpGet.h"
 #include "ip/IpSet.h"
+#include "ip/connection/IpConnectionList.h"
 #include "ip/dns/IpDNSSearchAdd.h"
 #include "ip/dns/IpDNSSearchList.h"
 #include "ip/dns/IpDNSSearchRemove.h"
@@ -32,6 +33,15 @@
 #include "ip/interface/IpInterfaceTagAdd.h"
 #include "ip/interface/IpInterfaceTagGet.h"
 #include "ip/interface/IpInterfaceTagRemove.h"
+#include "ip/ipsec/IpIpsecSAAdd.h"
+#include "ip/ipsec/IpIpsecSAList.h"
+#include "ip/ipsec/IpIpsecSARemove.h"
+#include "ip/ipsec/IpIpsecSPAdd.h"
+#include "ip/ipsec/IpIpsecSPList.h"
+#include "ip/ipsec/IpIpsecSPRemove.h"
+#include "ip/ipsec/IpIpsecSet.h"
+#include "ip/neighbor/IpNeighborList.h"
+#include "ip/neighbor/IpNeighborRemove.h"
 #include "ip/netstack/IpNetstackInstanceAdd.h"
 #include "ip/netstack/IpNetstackInstanceGet.h"
 #include "ip/netstack/IpNetstackInstanceList.h"
@@ -152,11 +162,11 @@ extern "C" __attribute__((visibility("default"))) void AutoCli_RegisterNamespace
                "Operations having to do with the creation, management and deletion of Pallad Netstack Instances.");
 
     // network ip neighbor
-    // list: IpNeighborList
-    // remove: IpNeighborRemove
+    ipNeighbor->RegisterNamespaceNode(IpNeighborList::New(), "list");
+    ipNeighbor->RegisterNamespaceNode(IpNeighborRemove::New(), "remove");
 
     // network ip connection
-    // list: IpConnectionList
+    ipConnection->RegisterNamespaceNode(IpConnectionList::New(), "list");
 
     // network ip dns
     auto ipDnsServer = Attach(ipDns, "server", "Operations pertaining to DNS server configuration.");
@@ -187,19 +197,19 @@ extern "C" __attribute__((visibility("default"))) void AutoCli_RegisterNamespace
     ipRouteIpv6->RegisterNamespaceNode(IpRouteIpv6List::New(), "list");
 
     // network ip ipsec
-    // set: IpIpsecSet
+    ipIpsec->RegisterNamespaceNode(IpIpsecSet::New(), "set");
     auto ipIpsecSa = Attach(ipIpsec, "sa", "Operations pertaining to Security Association");
     auto ipIpsecSp = Attach(ipIpsec, "sp", "Operations pertaining to Security Policy");
 
     // network ip ipsec sa
-    // add: IpIpsecSAAdd
-    // remove: IpIpsecSARemove
-    // list: IpIpsecSAList
+    ipIpsecSa->RegisterNamespaceNode(IpIpsecSAAdd::New(), "add");
+    ipIpsecSa->RegisterNamespaceNode(IpIpsecSARemove::New(), "remove");
+    ipIpsecSa->RegisterNamespaceNode(IpIpsecSAList::New(), "list");
 
     // network ip ipsec sp
-    // add: IpIpsecSPAdd
-    // remove: IpIpsecSPRemove
-    // list: IpIpsecSPList
+    ipIpsecSp->RegisterNamespaceNode(IpIpsecSPAdd::New(), "add");
+    ipIpsecSp->RegisterNamespaceNode(IpIpsecSPRemove::New(), "remove");
+    ipIpsecSp->RegisterNamespaceNode(IpIpsecSPList::New(), "list");
 
     // network ip interface
     ipInterface->RegisterNamespaceNode(IpInterfaceAdd::New(), "add");
