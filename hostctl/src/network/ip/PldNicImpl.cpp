@@ -179,7 +179,8 @@ void RemoveInterface(Store::Transaction& t, const InterfaceRecord& record) {
     }
     for (const NeighborRecord& neighbor : ListChildren<NeighborRecord>(t, record.netstack)) {
         if (neighbor.interfaceName == record.name) {
-            t.Remove(NeighborRecord::kSection, JoinedKey({neighbor.netstack, neighbor.interfaceName, neighbor.address}));
+            t.Remove(NeighborRecord::kSection,
+                     JoinedKey({neighbor.netstack, neighbor.interfaceName, neighbor.address}));
         }
     }
     t.Remove(InterfaceRecord::kSection, record.name);

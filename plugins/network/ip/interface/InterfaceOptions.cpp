@@ -79,16 +79,6 @@ void DeclareConnectionPointParameters(const boost::shared_ptr<CallSpec::InputSpe
                      Required::No);
 }
 
-void DeclareNetstackParameter(const boost::shared_ptr<CallSpec::InputSpec>& inputSpec) {
-    DeclareParameter(inputSpec, "netstack", CallSpec::PARAM_STRING, "N",
-                     "The network stack instance; if unspecified, use the default netstack instance", Required::No);
-}
-
-std::string NetstackOption(const CallSpec::Input& input) {
-    const std::string given = input.GetString("netstack");
-    return given.empty() ? std::string(DEFAULT_NETSTACK) : given;
-}
-
 bool CheckConnectionPointChoice(const CallSpec::Input& input, CallSpec::Output& output) {
     const bool portGroup = input.IsSet("portgroup-name");
     const bool dvSwitch = input.IsSet("dvs-name");

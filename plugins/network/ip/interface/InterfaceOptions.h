@@ -15,6 +15,7 @@
 #include "hostctl/network/ConnectionPoint.h"
 #include "hostctl/network/ip/PalladNicInfoImpl.h"
 #include "hostctl/network/ip/PldNic.h"
+#include "ip/IpOptions.h"
 
 namespace OrvixCli {
 namespace NetworkNamespace {
@@ -51,10 +52,6 @@ std::optional<HostCtl::Network::PldNicTagType> TagOption(const std::string& name
 // portgroup-name (p, with its own help), then dvs-name (s) and dvport-id (P).
 void DeclareConnectionPointParameters(const boost::shared_ptr<CallSpec::InputSpec>& inputSpec,
                                       const std::string& portGroupDescription);
-// The netstack option (N) of add and remove, and the netstack it names:
-// the default one when it is absent or empty.
-void DeclareNetstackParameter(const boost::shared_ptr<CallSpec::InputSpec>& inputSpec);
-std::string NetstackOption(const CallSpec::Input& input);
 
 // Whether the options name exactly one connection point: a port group, or a
 // distributed switch together with a port on it. Reports why not otherwise.

@@ -88,7 +88,7 @@ void IpInterfaceAdd::ExecuteInternal(boost::shared_ptr<CallSpec::Input> input,
         [&] {
             std::unique_ptr<HostCtl::Network::ConnectionPoint> point = MakeConnectionPoint(*input, *output);
             if (!point) return;
-            const std::string netstack = NetstackOption(*input);
+            const std::string netstack = SelectedNetstack(*input);
             PldCtl::Network::PalladNicInfoImpl interfaces;
             std::unique_ptr<HostCtl::Network::PldNic> nic =
                 interfaces.AddPalladNic(point.get(), netstack, HostCtl::Network::IpConfig(), *mac, 0, mtu, name);

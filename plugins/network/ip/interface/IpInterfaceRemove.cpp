@@ -60,7 +60,7 @@ void RemoveByConnectionPoint(PldCtl::Network::PalladNicInfoImpl& interfaces, con
     if (!CheckConnectionPointChoice(input, *output)) return;
     std::unique_ptr<HostCtl::Network::ConnectionPoint> point = MakeConnectionPoint(input, *output);
     if (!point) return;
-    interfaces.RemovePalladNic(point.get(), NetstackOption(input));
+    interfaces.RemovePalladNic(point.get(), SelectedNetstack(input));
     FinishTrue(output);
 }
 
