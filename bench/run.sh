@@ -3,7 +3,8 @@
 # that starts, dlopens one shared library and calls one function), measured in
 # the same run and interleaved with it. Prints medians and their ratios to the
 # baseline, on the default host and on a large one (about 1000 standard
-# switches, 4096 ports, 2000 port groups, 64 NICs, 256 interfaces, 10000 routes; made by
+# switches, 4096 ports, 2000 port groups, 64 NICs, 256 interfaces on 16
+# netstacks, 10000 routes, 2000 neighbors, 5000 connections; made by
 # orvix-bench-make-profile). Run it through `./dev bench` so that everything is
 # built.
 #
@@ -38,13 +39,43 @@ echo "Default host ($runs runs each, $(nproc) cores):"
     "network nic list" "$cli network nic list" \
     "network nic get" "$cli network nic get -n hwnic0" \
     "network nic stats get" "$cli network nic stats get -n hwnic0" \
-    "network nic up" "$cli network nic up -n hwnic0"
+    "network nic up" "$cli network nic up -n hwnic0" \
+    "network ip interface list" "$cli network ip interface list" \
+    "network ip interface ipv4 get" "$cli network ip interface ipv4 get" \
+    "network ip netstack list" "$cli network ip netstack list" \
+    "network ip interface add" "$cli network ip interface add -p Storage -i pld200" \
+    "network ip interface remove" "$cli network ip interface remove -i pld200" \
+    "network ip route ipv4 list" "$cli network ip route ipv4 list" \
+    "network ip route ipv6 list" "$cli network ip route ipv6 list" \
+    "network ip neighbor list" "$cli network ip neighbor list" \
+    "network ip connection list" "$cli network ip connection list" \
+    "network ip dns server list" "$cli network ip dns server list" \
+    "network ip route ipv4 add" "$cli network ip route ipv4 add -n 198.51.100.128/25 -g 192.0.2.1" \
+    "network ip route ipv4 remove" "$cli network ip route ipv4 remove -n 198.51.100.128/25 -g 192.0.2.1"
+
+# The kernel's own listing of as many routes, for comparison: a network
+# namespace made for this run (and deleted with it) holding 10000 routes on
+# its loopback device. Needs root and iproute2; skipped otherwise.
+kernel=()
+if [[ $(id -u) == 0 ]] && command -v ip >/dev/null && ip netns add "orvixbench$$" 2>/dev/null; then
+    netns=orvixbench$$
+    trap 'ip netns delete "$netns" 2>/dev/null; rm -rf "$work"' EXIT
+    for ((i = 0; i < 10000; i++)); do
+        echo "route add 10.$((i / 256)).$((i % 256)).0/24 dev lo"
+    done >"$work/routes.batch"
+    if ip -n "$netns" link set lo up && ip -n "$netns" -batch "$work/routes.batch" &&
+        [[ $(ip -n "$netns" route show | wc -l) -ge 10000 ]]; then
+        kernel=("ip route show (10000 routes, own namespace)" "ip -n $netns route show")
+    else
+        echo "(no kernel routing comparison: the namespace's routes could not be set up)" >&2
+    fi
+fi
 
 export ORVIX_HOST_DB=$work/large.db
 "$bin/orvix-bench-make-profile" >"$work/large.json"
 "$bin/orvix-hostsim" init --profile "$work/large.json" >/dev/null
 echo
-echo "Large host: 1000 switches, 4096 ports, 2000 port groups, 64 NICs, 256 interfaces, 10000 routes ($runs runs each):"
+echo "Large host: 1000 switches, 4096 ports, 2000 port groups, 64 NICs, 256 interfaces, 16 netstacks, 10000 routes, 2000 neighbors, 5000 connections ($runs runs each):"
 "$bin/orvix-bench-timer" "$runs" \
     "baseline (dlopen + one call)" "$bin/orvix-bench-baseline" \
     "network ip get" "$cli network ip get" \
@@ -56,4 +87,17 @@ echo "Large host: 1000 switches, 4096 ports, 2000 port groups, 64 NICs, 256 inte
     "network nic list" "$cli network nic list" \
     "network nic get" "$cli network nic get -n hwnic63" \
     "network nic stats get" "$cli network nic stats get -n hwnic63" \
-    "network nic up" "$cli network nic up -n hwnic63"
+    "network nic up" "$cli network nic up -n hwnic63" \
+    "network ip interface list" "$cli network ip interface list" \
+    "network ip interface ipv4 get" "$cli network ip interface ipv4 get" \
+    "network ip netstack list" "$cli network ip netstack list" \
+    "network ip interface remove" "$cli network ip interface remove -i pld255" \
+    "network ip interface add" "$cli network ip interface add -p vSwitch255-pg0 -N stack15 -i pld255" \
+    "${kernel[@]}" \
+    "network ip route ipv4 list" "$cli network ip route ipv4 list" \
+    "network ip route ipv6 list" "$cli network ip route ipv6 list" \
+    "network ip neighbor list" "$cli network ip neighbor list" \
+    "network ip connection list" "$cli network ip connection list" \
+    "network ip dns server list" "$cli network ip dns server list" \
+    "network ip route ipv4 add" "$cli network ip route ipv4 add -n 203.0.113.128/25 -g 198.51.100.2" \
+    "network ip route ipv4 remove" "$cli network ip route ipv4 remove -n 203.0.113.128/25 -g 198.51.100.2"
