@@ -54,18 +54,18 @@ std::vector<std::shared_ptr<const InterfaceRecord>> ListInterfaces(Store::HostSt
 // What a connection point names, read before a change: a DV port object
 // reads the host for its stored connection id, which it may not do inside
 // another read or change.
-struct PointSpec {
+struct PointParts {
     int type = 0;
     std::string portGroup;
     HostCtl::Network::DVPortParam dvPort;
 };
 
-PointSpec SpecOf(const ConnectionPoint& point) {
-    PointSpec spec;
-    spec.type = point.GetType();
-    if (spec.type == ConnectionPoint::TYPE_PORT_GROUP) spec.portGroup = point.GetPortGroupName();
-    if (spec.type == ConnectionPoint::TYPE_DV_PORT) spec.dvPort = point.GetDVPortParam();
-    return spec;
+PointParts PartsOf(const ConnectionPoint& point) {
+    PointParts parts;
+    parts.type = point.GetType();
+    if (parts.type == ConnectionPoint::TYPE_PORT_GROUP) parts.portGroup = point.GetPortGroupName();
+    if (parts.type == ConnectionPoint::TYPE_DV_PORT) parts.dvPort = point.GetDVPortParam();
+    return parts;
 }
 
 // Where a new interface's port goes, and what the interface records of it.
@@ -102,7 +102,7 @@ Detail::StoredObject<Detail::DvPortRecord> RequireDvPort(Transaction& t, const H
 
 // Checks the connection point for a new interface and says where its port
 // goes; a DV port takes the point's connection id.
-Attachment Attach(Transaction& t, const PointSpec& point,
+Attachment Attach(Transaction& t, const PointParts& point,
                   const std::vector<std::shared_ptr<const InterfaceRecord>>& interfaces) {
     Attachment attachment;
     switch (point.type) {
@@ -187,7 +187,7 @@ MacAddress PickMac(const MacAddress& mac, const std::vector<std::shared_ptr<cons
 }
 
 // The interface connected at `point` on `netstack`, or null.
-std::shared_ptr<const InterfaceRecord> ConnectedAt(Store::Transaction& t, const PointSpec& point,
+std::shared_ptr<const InterfaceRecord> ConnectedAt(Store::Transaction& t, const PointParts& point,
                                                    const std::string& netstack) {
     std::string dvswitch;
     if (point.type == ConnectionPoint::TYPE_DV_PORT) {
@@ -228,11 +228,11 @@ std::unique_ptr<PldNic> PalladNicInfoImpl::AddPalladNic(ConnectionPoint* point, 
                                                         std::int64_t mtu, const std::string& name) {
     Store::HostStore& store = Detail::EnterOperation("PalladNicInfoImpl::AddPalladNic", name);
     if (!point) throw HostCtlException("An interface needs a connection point");
-    const PointSpec spec = SpecOf(*point);
+    const PointParts parts = PartsOf(*point);
     std::shared_ptr<const InterfaceRecord> created;
     store.Change([&](Transaction& t) {
         const auto interfaces = Detail::DecodeShared<InterfaceRecord>(t.ListText(InterfaceRecord::kSection));
-        const Attachment attachment = Attach(t, spec, interfaces);
+        const Attachment attachment = Attach(t, parts, interfaces);
         if (!t.Exists(Detail::NetstackRecord::kSection, netstack)) {
             throw HostCtlException(Detail::MissingNetstackMessage(netstack));
         }
@@ -272,9 +272,9 @@ std::unique_ptr<PldNic> PalladNicInfoImpl::AddPalladNic(ConnectionPoint* point, 
 
 void PalladNicInfoImpl::RemovePalladNic(ConnectionPoint* point, const std::string& netstack) {
     Store::HostStore& store = Detail::EnterOperation("PalladNicInfoImpl::RemovePalladNic", netstack);
-    const std::optional<PointSpec> spec = point ? std::optional<PointSpec>(SpecOf(*point)) : std::nullopt;
+    const std::optional<PointParts> parts = point ? std::optional<PointParts>(PartsOf(*point)) : std::nullopt;
     store.Change([&](Transaction& t) {
-        std::shared_ptr<const InterfaceRecord> nic = spec ? ConnectedAt(t, *spec, netstack) : nullptr;
+        std::shared_ptr<const InterfaceRecord> nic = parts ? ConnectedAt(t, *parts, netstack) : nullptr;
         if (!nic) {
             throw HostCtlException("No interface is connected to that connection point on netstack " + netstack);
         }
