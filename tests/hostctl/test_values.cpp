@@ -2,6 +2,10 @@
 
 #include <gtest/gtest.h>
 
+#include <arpa/inet.h>
+
+#include <cstdint>
+
 #include <memory>
 #include <string>
 #include <vector>
@@ -78,6 +82,21 @@ TEST(Ipv4AddressTest, ParsesStrictDottedQuadsOnly) {
         Ipv4Address::IsValidAddress, "IPv4 address",
         {"", "1.2.3", "1.2.3.4.5", "256.0.0.1", "1.2.3.300", "01.2.3.4", "1.2.3.04", "1.2.3.00", " 1.2.3.4", "1.2.3.4 ",
          "1. 2.3.4", "0x1.2.3.4", "1.2.3.-4", "1..3.4", "1.2.3.4.", "1.2.3.4/24", "16909060", "::1", "1.2.3.4\0.5"s});
+}
+
+// The dotted text is written out digit by digit; it must agree with the C
+// library's conversion for every width of every octet.
+TEST(Ipv4AddressTest, TextAgreesWithTheCLibrary) {
+    std::uint32_t value = 0x01020304;
+    for (int i = 0; i < 200000; ++i) {
+        value = value * 1664525u + 1013904223u;
+        const std::uint32_t network = htonl(value);
+        char expected[INET_ADDRSTRLEN] = {};
+        ASSERT_NE(inet_ntop(AF_INET, &network, expected, sizeof expected), nullptr);
+        ASSERT_EQ(Ipv4Address(value).GetStringAddress(), expected) << value;
+    }
+    EXPECT_EQ(Ipv4Address(0xFFFFFFFFu).GetStringAddress(), "255.255.255.255");
+    EXPECT_EQ(Ipv4Address(0x0A006409u).GetStringAddress(), "10.0.100.9");
 }
 
 TEST(Ipv4AddressTest, UnsetOrderAndPolymorphism) {

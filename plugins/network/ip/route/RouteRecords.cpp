@@ -26,13 +26,15 @@ std::vector<std::string> Fields(RouteFamily family) {
 
 void AppendIpv4Rows(MetaObj::MetaList& rows, RoutingInfoImpl& routing) {
     for (const HostCtl::Network::Ipv4Route& route : routing.GetCurrentPalladRoutes()) {
-        boost::shared_ptr<MetaObj::MetaStruct> row = RouteRecordTemplate(RouteFamily::Ipv4);
-        row->SetField("Netmask", route.network.GetNetmask().GetStringAddress());
-        row->SetField("Interface", route.interfaceName);
+        // Fields are set in the record's own order, so a row needs no
+        // template of placeholders first: a listing makes thousands of them.
+        boost::shared_ptr<MetaObj::MetaStruct> row = MetaObj::MetaStruct::New(RecordType(RouteFamily::Ipv4));
         row->SetField("Network", route.network == RoutingInfoImpl::DEFAULT_IPV4_ROUTE
                                      ? std::string("default")
                                      : route.network.GetNetwork().GetStringAddress());
+        row->SetField("Netmask", route.network.GetNetmask().GetStringAddress());
         row->SetField("Gateway", route.gateway.GetStringAddress());
+        row->SetField("Interface", route.interfaceName);
         row->SetField("Source", routing.GetDefaultGatewaySource(route.network));
         rows.Append(std::move(row));
     }
@@ -40,13 +42,13 @@ void AppendIpv4Rows(MetaObj::MetaList& rows, RoutingInfoImpl& routing) {
 
 void AppendIpv6Rows(MetaObj::MetaList& rows, RoutingInfoImpl& routing) {
     for (const HostCtl::Network::Ipv6Route& route : routing.GetCurrentIpv6PalladRoutes()) {
-        boost::shared_ptr<MetaObj::MetaStruct> row = RouteRecordTemplate(RouteFamily::Ipv6);
-        row->SetField("Netmask", Ipv6Network::NetmaskFromNumber(route.network.GetNetmask()).GetStringAddress());
-        row->SetField("Interface", route.interfaceName);
+        boost::shared_ptr<MetaObj::MetaStruct> row = MetaObj::MetaStruct::New(RecordType(RouteFamily::Ipv6));
         row->SetField("Network", route.network == RoutingInfoImpl::DEFAULT_IPV6_ROUTE
                                      ? std::string("default")
                                      : route.network.GetAddress().GetStringAddress());
+        row->SetField("Netmask", Ipv6Network::NetmaskFromNumber(route.network.GetNetmask()).GetStringAddress());
         row->SetField("Gateway", route.gateway.GetStringAddress());
+        row->SetField("Interface", route.interfaceName);
         rows.Append(std::move(row));
     }
 }
