@@ -19,6 +19,7 @@
 
 #include "framework/Runner.h"
 #include "hostctl/HostFixture.h"
+#include "hostctl/network/ip/NetstackInstance.h"
 #include "ip/interface/InterfaceOptions.h"
 #include "ip/interface/IpInterfaceAdd.h"
 
@@ -106,7 +107,7 @@ TEST(DedicatedNetstacks, AreNamedExactlyAndTheirTagsLeadBackToThem) {
     for (PldNicTagType tag : {HostCtl::Network::PLDNIC_TAG_MANAGEMENT, HostCtl::Network::PLDNIC_TAG_BACKUP,
                               HostCtl::Network::PLDNIC_TAG_REPLICATION, HostCtl::Network::PLDNIC_TAG_STORAGE,
                               HostCtl::Network::PLDNIC_TAG_TELEMETRY}) {
-        EXPECT_EQ(NetstackOfTag(tag), DEFAULT_NETSTACK) << tag;
+        EXPECT_EQ(NetstackOfTag(tag), HostCtl::Network::NetstackInstance::DEFAULT_KEY) << tag;
     }
 }
 

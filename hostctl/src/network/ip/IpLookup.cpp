@@ -4,6 +4,7 @@
 #include <array>
 #include <utility>
 
+#include "Refusals.h"
 #include "hostctl/network/ip/PldNic.h"
 
 namespace PldCtl {
@@ -96,10 +97,7 @@ StoredObject<NetstackRecord> RequireNetstack(Store::Transaction& t, const std::s
 
 void CheckMtu(std::int64_t mtu, const std::string& name) {
     using HostCtl::Network::PldNic;
-    if (mtu >= PldNic::MIN_MTU && mtu <= PldNic::MAX_MTU) return;
-    throw HostCtlException("Invalid MTU value " + std::to_string(mtu) + (name.empty() ? "" : " for interface " + name) +
-                           ": must be between " + std::to_string(PldNic::MIN_MTU) + " and " +
-                           std::to_string(PldNic::MAX_MTU));
+    CheckRange("MTU", mtu, name.empty() ? std::string() : "interface " + name, PldNic::MIN_MTU, PldNic::MAX_MTU);
 }
 
 IpConfig IpConfigAccess::FromRecord(const InterfaceRecord& record, bool withDhcpDns) {

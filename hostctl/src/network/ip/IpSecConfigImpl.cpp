@@ -3,16 +3,13 @@
 // display tables below; the store keeps the words.
 #include "hostctl/network/ip/IpSecConfigImpl.h"
 
-#include <fcntl.h>
-#include <sys/stat.h>
-#include <unistd.h>
-
 #include <algorithm>
 #include <cctype>
 #include <cerrno>
 #include <cstdio>
 #include <cstring>
 
+#include "Refusals.h"
 #include "hostctl/util/Exec.h"
 #include "network/ip/IpLookup.h"
 #include "network/ip/IpsecRecords.h"
@@ -138,45 +135,19 @@ void MarkSpsUnknown(Store::Transaction& t, Removed removed) {
     }
 }
 
-struct Fd {
-    int fd;
-    ~Fd() {
-        if (fd >= 0) close(fd);
-    }
-};
-
 // The text of an IKE configuration file, read without ever blocking: a
 // regular file of at most 64 KiB holding text.
 std::string ReadIkeConfig(const std::string& path) {
     const std::string name = "IKE configuration " + path;
-    auto unreadable = [&](const std::string& reason) { return HostCtlException(name + " cannot be read: " + reason); };
-    Fd file{open(path.c_str(), O_RDONLY | O_NONBLOCK | O_CLOEXEC | O_NOCTTY)};
-    if (file.fd < 0) throw unreadable(std::strerror(errno));
-    struct stat st {};
-    if (fstat(file.fd, &st) != 0) throw unreadable(std::strerror(errno));
-    if (!S_ISREG(st.st_mode)) throw HostCtlException(name + " is not a regular file");
-    auto tooLarge = [&](std::uint64_t size) {
-        return HostCtlException(name + " has " + std::to_string(size) + " bytes, more than the " +
-                                std::to_string(kMaxIkeConfigBytes) + " allowed");
-    };
-    if (static_cast<std::uint64_t>(st.st_size) > kMaxIkeConfigBytes)
-        throw tooLarge(static_cast<std::uint64_t>(st.st_size));
-    // The file may grow while it is read: read one byte past the bound.
-    std::string text(kMaxIkeConfigBytes + 1, '\0');
-    std::size_t length = 0;
-    while (length < text.size()) {
-        const ssize_t got = read(file.fd, &text[length], text.size() - length);
-        if (got < 0 && errno == EINTR) continue;
-        if (got < 0) throw unreadable(std::strerror(errno));
-        if (got == 0) break;
-        length += static_cast<std::size_t>(got);
-    }
-    if (length > kMaxIkeConfigBytes) throw tooLarge(length);
-    text.resize(length);
+    const std::string text =
+        Detail::ReadRegularFile("IKE configuration", path, kMaxIkeConfigBytes, [&](std::uint64_t size) {
+            return name + " has " + std::to_string(size) + " bytes, more than the " +
+                   std::to_string(kMaxIkeConfigBytes) + " allowed";
+        });
     for (const char c : text) {
         const auto byte = static_cast<unsigned char>(c);
         if ((byte < ' ' && byte != '\n' && byte != '\t' && byte != '\r') || byte == 0x7f) {
-            throw unreadable("it is not a text file");
+            throw HostCtlException(name + " cannot be read: it is not a text file");
         }
     }
     return text;

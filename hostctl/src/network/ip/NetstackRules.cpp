@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <limits>
 
+#include "Refusals.h"
 #include "hostctl/Lib.h"
 #include "network/NetworkRecords.h"
 
@@ -46,10 +47,7 @@ void CheckNetstackKey(const std::string& key) {
 }
 
 void CheckMaxConnections(std::int64_t maxConnections, const std::string& key) {
-    if (maxConnections >= 1 && maxConnections <= kMaxConnectionsLimit) return;
-    throw HostCtlException("Invalid maximum connections value " + std::to_string(maxConnections) +
-                           " for netstack instance " + key + ": must be between 1 and " +
-                           std::to_string(kMaxConnectionsLimit));
+    CheckRange("maximum connections", maxConnections, "netstack instance " + key, 1, kMaxConnectionsLimit);
 }
 
 void CheckCongestionControlAlgorithm(Store::Transaction& t, const std::string& algorithm) {

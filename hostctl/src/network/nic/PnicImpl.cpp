@@ -6,16 +6,13 @@
 // writes only what changed and refreshes the snapshot from what was written.
 #include "hostctl/network/nic/PnicImpl.h"
 
-#include <fcntl.h>
-#include <sys/stat.h>
-#include <unistd.h>
-
 #include <algorithm>
 #include <cerrno>
 #include <cstring>
 #include <limits>
 
 #include "Operation.h"
+#include "Refusals.h"
 #include "network/nic/NicRecords.h"
 
 HostCtl::Network::Pnic::~Pnic() = default;
@@ -49,10 +46,7 @@ private:
 
 // Refuses `value` outside lo..hi for the NIC's field `what`.
 void CheckRange(const std::string& nic, const char* what, std::int64_t value, std::int64_t lo, std::int64_t hi) {
-    if (value < lo || value > hi) {
-        throw HostCtlException("Invalid " + std::string(what) + " value " + std::to_string(value) + " for NIC " + nic +
-                               ": must be between " + std::to_string(lo) + " and " + std::to_string(hi));
-    }
+    Detail::CheckRange(what, value, "NIC " + nic, lo, hi);
 }
 
 [[noreturn]] void Unsupported(const std::string& nic, const char* what) {
@@ -137,63 +131,13 @@ void CheckMagic(const NicRecord& nic, std::int64_t magic) {
     }
 }
 
-// Closes a file descriptor on every path.
-class FileHandle {
-public:
-    explicit FileHandle(int fd) : fd_(fd) {}
-    ~FileHandle() {
-        if (fd_ >= 0) ::close(fd_);
-    }
-    FileHandle(const FileHandle&) = delete;
-    FileHandle& operator=(const FileHandle&) = delete;
-    int Get() const { return fd_; }
-
-private:
-    int fd_;
-};
-
-[[noreturn]] void Unreadable(const std::string& fileName, int error) {
-    throw HostCtlException("EEPROM file " + fileName + " cannot be read: " + std::strerror(error));
-}
-
-[[noreturn]] void NotRegular(const std::string& fileName) {
-    throw HostCtlException("EEPROM file " + fileName + " is not a regular file");
-}
-
-[[noreturn]] void TooLarge(const std::string& fileName, std::uint64_t size, const NicRecord& nic, std::size_t limit) {
-    throw HostCtlException("EEPROM file " + fileName + " has " + std::to_string(size) + " bytes, more than the " +
-                           std::to_string(limit) + " bytes of the EEPROM of NIC " + nic.name);
-}
-
-// The content of a regular file of at most `limit` bytes. A FIFO, device or
-// directory is refused without ever being read, so naming one never blocks:
-// the name is looked at first, and the file opened without blocking is
-// looked at again, in case the name was replaced in between.
+// The content of a regular file of at most `limit` bytes, the EEPROM's size.
 std::vector<std::uint8_t> ReadEepromFile(const std::string& fileName, const NicRecord& nic, std::size_t limit) {
-    struct stat info {};
-    if (::stat(fileName.c_str(), &info) != 0) Unreadable(fileName, errno);
-    if (!S_ISREG(info.st_mode)) NotRegular(fileName);
-    FileHandle file(::open(fileName.c_str(), O_RDONLY | O_NONBLOCK | O_CLOEXEC | O_NOCTTY));
-    if (file.Get() < 0) Unreadable(fileName, errno);
-    if (::fstat(file.Get(), &info) != 0) Unreadable(fileName, errno);
-    if (!S_ISREG(info.st_mode)) NotRegular(fileName);
-    if (static_cast<std::uint64_t>(info.st_size) > limit)
-        TooLarge(fileName, static_cast<std::uint64_t>(info.st_size), nic, limit);
-    // One byte more than allowed shows a file that grew since fstat.
-    std::vector<std::uint8_t> bytes(limit + 1);
-    std::size_t done = 0;
-    while (done < bytes.size()) {
-        const ssize_t got = ::pread(file.Get(), bytes.data() + done, bytes.size() - done, static_cast<off_t>(done));
-        if (got < 0) {
-            if (errno == EINTR) continue;
-            Unreadable(fileName, errno);
-        }
-        if (got == 0) break;
-        done += static_cast<std::size_t>(got);
-    }
-    if (done > limit) TooLarge(fileName, done, nic, limit);
-    bytes.resize(done);
-    return bytes;
+    const std::string content = Detail::ReadRegularFile("EEPROM file", fileName, limit, [&](std::uint64_t size) {
+        return "EEPROM file " + fileName + " has " + std::to_string(size) + " bytes, more than the " +
+               std::to_string(limit) + " bytes of the EEPROM of NIC " + nic.name;
+    });
+    return std::vector<std::uint8_t>(content.begin(), content.end());
 }
 
 // The members of the software-simulation record by feature.

@@ -16,8 +16,6 @@ namespace NetworkNamespace {
 
 using HostCtl::Network::PldNicTagType;
 
-const char* const DEFAULT_NETSTACK = HostCtl::Network::NetstackInstance::DEFAULT_KEY;
-
 const char* const INTERFACE_NAME_EXPRESSION = "pld([0-9]|[1-9][0-9]|1[0-9][0-9]|2[0-4][0-9]|25[0-5])";
 
 namespace {
@@ -46,7 +44,7 @@ std::string NetstackOfTag(PldNicTagType tag) {
     for (const DedicatedNetstack& dedicated : kDedicatedNetstacks) {
         if (tag == dedicated.tag) return dedicated.key;
     }
-    return DEFAULT_NETSTACK;
+    return HostCtl::Network::NetstackInstance::DEFAULT_KEY;
 }
 
 std::string SupportedTagsText() {
@@ -163,7 +161,7 @@ void AutoTagInterfaceOnDedicatedStack(PldCtl::Network::PalladNicInfoImpl& interf
     const std::vector<std::unique_ptr<HostCtl::Network::PldNic>> tagged = interfaces.GetPalladNicsByTag(tag);
     try {
         for (const auto& holder : tagged) {
-            if (holder->GetNetstackInstance() != DEFAULT_NETSTACK) continue;
+            if (holder->GetNetstackInstance() != HostCtl::Network::NetstackInstance::DEFAULT_KEY) continue;
             holder->RemoveTag(tag);
             untagged.push_back(holder.get());
         }

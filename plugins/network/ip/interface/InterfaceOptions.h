@@ -20,9 +20,6 @@
 namespace OrvixCli {
 namespace NetworkNamespace {
 
-// The key of the netstack instance an option left empty stands for.
-extern const char* const DEFAULT_NETSTACK;
-
 // "pld" and a number 0 to 255 without leading zeros; the framework matches
 // it against the whole name.
 extern const char* const INTERFACE_NAME_EXPRESSION;

@@ -42,7 +42,7 @@ namespace {
 // Whether the netstack a dedicated tag belongs to runs in the kernel with
 // interfaces on it: then the tag is its own and cannot be given by hand.
 bool DedicatedStackInstantiated(PldCtl::Network::PalladNicInfoImpl& interfaces, const std::string& netstack) {
-    if (netstack == DEFAULT_NETSTACK) return false;
+    if (netstack == HostCtl::Network::NetstackInstance::DEFAULT_KEY) return false;
     std::unique_ptr<HostCtl::Network::NetworkInfo> networkInfo = HostCtl::Network::NetworkFactory::GetNetworkInfo();
     if (networkInfo->GetNetstackInstanceState(netstack) != HostCtl::Network::NetstackInstance::STATE_IN_KERNEL) {
         return false;
