@@ -16,6 +16,7 @@ int main(int argc, char** argv) {
     AutoCli::RunOptions options;
     options.program = "orvixcli";
     options.version = ORVIX_VERSION;
+    options.exitsAfterRun = true;
     int status = AutoCli::Run(root, args, std::cout, std::cerr, options);
 
     // Output that could not be written (a full disk, a closed pipe) must not

@@ -88,6 +88,12 @@ boost::shared_ptr<MetaStruct> MetaStruct::New(const std::string& typeName) {
     return boost::make_shared<MetaStruct>(Token(), typeName);
 }
 
+boost::shared_ptr<MetaStruct> MetaStruct::New(const std::string& typeName, std::size_t fieldCount) {
+    boost::shared_ptr<MetaStruct> record = boost::make_shared<MetaStruct>(Token(), typeName);
+    record->fields_.reserve(fieldCount);
+    return record;
+}
+
 void MetaStruct::Put(const std::string& name, MetaObjectPtr&& value) {
     for (auto& field : fields_) {
         if (field.first == name) {
@@ -97,7 +103,7 @@ void MetaStruct::Put(const std::string& name, MetaObjectPtr&& value) {
     }
     // Room for a typical record at once, instead of growing one field at a
     // time: listings make thousands of records.
-    if (fields_.empty()) fields_.reserve(kTypicalFieldCount);
+    if (fields_.capacity() == 0) fields_.reserve(kTypicalFieldCount);
     fields_.emplace_back(name, std::move(value));
 }
 

@@ -5,6 +5,7 @@
 #include <algorithm>
 #include <bitset>
 #include <optional>
+#include <string_view>
 #include <tuple>
 #include <utility>
 
@@ -16,7 +17,6 @@ namespace Network {
 namespace {
 
 using Lib::HostCtlException;
-using Ipv4Bytes = std::array<uint8_t, 4>;
 
 // Every parser below returns nothing for bad text, so the IsValid... checks
 // and the constructors share one path; only the constructors turn a failure
@@ -37,11 +37,12 @@ int CheckedPrefix(int prefixLength, int maximum, const char* family) {
 }
 
 template <int AddressFamily, std::size_t Size>
-std::optional<std::array<uint8_t, Size>> ParseWithPton(const std::string& text) {
+std::optional<std::array<uint8_t, Size>> ParseWithPton(std::string_view text) {
     // inet_pton reads a C string: an embedded NUL would silently cut the
     // text short and let whatever follows it pass unchecked.
     std::array<uint8_t, Size> bytes{};
-    if (text.find('\0') != std::string::npos || inet_pton(AddressFamily, text.c_str(), bytes.data()) != 1) {
+    if (text.find('\0') != std::string_view::npos ||
+        inet_pton(AddressFamily, std::string(text).c_str(), bytes.data()) != 1) {
         return std::nullopt;
     }
     return bytes;
@@ -54,26 +55,40 @@ std::string FormatWithNtop(const std::array<uint8_t, Size>& bytes) {
     return text;
 }
 
-uint32_t ToHostOrder(const Ipv4Bytes& bytes) {
-    return uint32_t{bytes[0]} << 24 | uint32_t{bytes[1]} << 16 | uint32_t{bytes[2]} << 8 | bytes[3];
+// Exactly four decimal parts of 0-255 without leading zeros, the spelling
+// the C library's reader insists on too; other spellings the classic
+// resolver functions take (hex, octal, fewer parts) are refused. Read
+// directly: listings parse tens of thousands of stored addresses.
+std::optional<Ipv4Address> ParseIpv4(std::string_view text) {
+    uint32_t value = 0;
+    std::size_t pos = 0;
+    for (int part = 0; part < 4; ++part) {
+        if (part > 0) {
+            if (pos >= text.size() || text[pos] != '.') return std::nullopt;
+            ++pos;
+        }
+        const std::size_t start = pos;
+        unsigned octet = 0;
+        while (pos < text.size() && text[pos] >= '0' && text[pos] <= '9' && pos - start < 3) {
+            octet = octet * 10 + static_cast<unsigned>(text[pos] - '0');
+            ++pos;
+        }
+        const std::size_t digits = pos - start;
+        if (digits == 0 || octet > 255 || (digits > 1 && text[start] == '0')) return std::nullopt;
+        value = value << 8 | octet;
+    }
+    if (pos != text.size()) return std::nullopt;
+    return Ipv4Address(value);
 }
 
-// glibc's reader already insists on exactly four decimal parts of 0-255
-// without leading zeros; other spellings the classic resolver functions take
-// (hex, octal, fewer parts) are refused.
-std::optional<Ipv4Address> ParseIpv4(const std::string& text) {
-    const auto bytes = ParseWithPton<AF_INET, 4>(text);
-    return bytes ? std::optional<Ipv4Address>(Ipv4Address(ToHostOrder(*bytes))) : std::nullopt;
-}
-
-std::optional<Ipv6Address> ParseIpv6(const std::string& text) {
+std::optional<Ipv6Address> ParseIpv6(std::string_view text) {
     const auto bytes = ParseWithPton<AF_INET6, 16>(text);
     return bytes ? std::optional<Ipv6Address>(Ipv6Address(*bytes)) : std::nullopt;
 }
 
 // A prefix length in plain decimal: "0", or digits without a leading zero,
 // so that every length has exactly one spelling.
-std::optional<int> ParsePrefix(const std::string& text, int maximum) {
+std::optional<int> ParsePrefix(std::string_view text, int maximum) {
     if (text.empty() || text.size() > 3 || (text.size() > 1 && text[0] == '0')) {
         return std::nullopt;
     }
@@ -89,9 +104,9 @@ std::optional<int> ParsePrefix(const std::string& text, int maximum) {
 
 // "address/suffix" split at the first slash; a second slash stays in the
 // suffix, where it fails to parse.
-std::optional<std::pair<std::string, std::string>> SplitAtSlash(const std::string& text) {
+std::optional<std::pair<std::string_view, std::string_view>> SplitAtSlash(std::string_view text) {
     const auto slash = text.find('/');
-    if (slash == std::string::npos) {
+    if (slash == std::string_view::npos) {
         return std::nullopt;
     }
     return std::make_pair(text.substr(0, slash), text.substr(slash + 1));

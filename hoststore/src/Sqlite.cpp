@@ -97,6 +97,12 @@ std::string Query::Text(int column) const {
     return text ? std::string(text, static_cast<std::size_t>(sqlite3_column_bytes(stmt_, column))) : std::string();
 }
 
+std::string_view Query::TextView(int column) const {
+    const auto* text = reinterpret_cast<const char*>(sqlite3_column_text(stmt_, column));
+    return text ? std::string_view(text, static_cast<std::size_t>(sqlite3_column_bytes(stmt_, column)))
+                : std::string_view();
+}
+
 std::int64_t Query::Int(int column) const {
     return sqlite3_column_int64(stmt_, column);
 }

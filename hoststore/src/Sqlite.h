@@ -7,6 +7,7 @@
 #include <memory>
 #include <optional>
 #include <string>
+#include <string_view>
 #include <unordered_map>
 
 #include "hoststore/HostStore.h"
@@ -56,6 +57,8 @@ public:
     void Run();
 
     std::string Text(int column) const;
+    // The same text without a copy; valid until the next step.
+    std::string_view TextView(int column) const;
     std::int64_t Int(int column) const;
     bool IsNull(int column) const;
 

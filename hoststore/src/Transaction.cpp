@@ -247,6 +247,13 @@ std::vector<std::string> Transaction::ListChildrenText(const std::string& sectio
     return Texts(query);
 }
 
+void Transaction::EachChildText(const std::string& section, const std::string& parent,
+                                const std::function<void(std::string_view)>& visit) {
+    auto query = Statement(store_.impl_->db, section, "SELECT doc FROM %T WHERE parent = ?1 ORDER BY seq");
+    query.Bind(1, parent);
+    while (query.Next()) visit(query.TextView(0));
+}
+
 std::vector<std::string> Transaction::ListByParentOrderText(const std::string& section) {
     const CollectionInfo& collection = Collection(section);
     if (!collection.parentSection) {

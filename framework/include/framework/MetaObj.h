@@ -111,6 +111,9 @@ public:
     using Field = std::pair<std::string, MetaObjectPtr>;
 
     static boost::shared_ptr<MetaStruct> New(const std::string& typeName);
+    // The same, with room for exactly `fieldCount` fields: a listing that
+    // makes thousands of records of a known shape wastes none.
+    static boost::shared_ptr<MetaStruct> New(const std::string& typeName, std::size_t fieldCount);
     MetaStruct(Token, const std::string& typeName) : typeName_(typeName) {}
 
     MetaType GetType() const override { return META_STRUCT; }

@@ -58,6 +58,12 @@ AUTOCLI_EXPORT std::string ExpandDescription(const CallSpec::ParameterSpec& para
 struct RunOptions {
     std::string program = "orvixcli";
     std::string version;
+    // The process ends right after this run. The command's result is then
+    // left standing instead of being taken apart object by object: a listing
+    // of ten thousand records would spend a tenth of its time on that, and
+    // the memory goes back to the system with the process anyway. A caller
+    // that runs several command lines in one process leaves this off.
+    bool exitsAfterRun = false;
 };
 
 // Runs one command line. Never throws: whatever a command lets escape is

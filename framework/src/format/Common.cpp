@@ -265,20 +265,38 @@ bool BuildTable(const MetaObject& result, const FormatHints& hints, const Inline
     }
 
     table.columns = ChooseColumns(records, elementTemplate, hints);
-    table.rows.clear();
-    table.rows.reserve(records.size());
+    const std::size_t columnCount = table.columns.size();
+    table.cells.clear();
+    table.widths.clear();
+    table.cells.reserve(records.size() * columnCount);
+    table.widths.reserve(records.size() * columnCount);
     for (const MetaStruct* record : records) {
-        std::vector<std::string> row(table.columns.size());
-        for (std::size_t i = 0; i < table.columns.size(); ++i) {
-            for (const auto& field : record->GetFields()) {
-                if (field.first != table.columns[i]) continue;
-                if (IsPresent(field.second)) {
-                    AppendInlineText(row[i], *field.second, record->GetTypeName(), field.first, hints, style);
+        const std::vector<MetaStruct::Field>& fields = record->GetFields();
+        // Records usually hold their fields in the columns' order, so the
+        // field after the previous column's is tried first.
+        std::size_t next = 0;
+        for (std::size_t i = 0; i < columnCount; ++i) {
+            const MetaStruct::Field* field = nullptr;
+            if (next < fields.size() && fields[next].first == table.columns[i]) {
+                field = &fields[next];
+            } else {
+                for (const auto& candidate : fields) {
+                    if (candidate.first == table.columns[i]) {
+                        field = &candidate;
+                        break;
+                    }
                 }
-                break;
             }
+            std::string cell;
+            if (field) {
+                next = static_cast<std::size_t>(field - fields.data()) + 1;
+                if (IsPresent(field->second)) {
+                    AppendInlineText(cell, *field->second, record->GetTypeName(), field->first, hints, style);
+                }
+            }
+            table.widths.push_back(DisplayWidth(cell));
+            table.cells.push_back(std::move(cell));
         }
-        table.rows.push_back(std::move(row));
     }
     return true;
 }

@@ -81,9 +81,17 @@ void AppendInlineText(std::string& out, const MetaObject& value, const std::stri
                       const FormatHints& hints, const InlineStyle& style);
 
 // A result laid out as columns and rows of cell text, for table and csv.
+// The cells are kept row by row in one array, `columns.size()` to a row,
+// each with its display width: a listing of ten thousand rows makes no
+// array per row and measures each cell once.
 struct Table {
     std::vector<std::string> columns;
-    std::vector<std::vector<std::string>> rows;
+    std::vector<std::string> cells;
+    std::vector<std::size_t> widths;
+
+    std::size_t RowCount() const { return columns.empty() ? 0 : cells.size() / columns.size(); }
+    const std::string* RowCells(std::size_t row) const { return cells.data() + row * columns.size(); }
+    const std::size_t* RowWidths(std::size_t row) const { return widths.data() + row * columns.size(); }
 };
 
 // Lays out a record (one row) or a list of records. Returns false for any

@@ -19,10 +19,10 @@ std::string Cell(const std::string& text) {
     return quoted + '"';
 }
 
-void WriteRow(const std::vector<std::string>& cells, std::ostream& out) {
+void WriteRow(const std::string* cells, std::size_t count, std::ostream& out) {
     const char* separator = "";
-    for (const auto& cell : cells) {
-        out << separator << Cell(cell);
+    for (const std::string* cell = cells; cell != cells + count; ++cell) {
+        out << separator << Cell(*cell);
         separator = ",";
     }
     out << '\n';
@@ -34,8 +34,10 @@ void WriteCsv(const MetaObject& result, const FormatHints& hints, std::ostream& 
     Table table;
     if (BuildTable(result, hints, kCsvStyle, table)) {
         if (table.columns.empty()) return;
-        WriteRow(table.columns, out);
-        for (const auto& row : table.rows) WriteRow(row, out);
+        WriteRow(table.columns.data(), table.columns.size(), out);
+        for (std::size_t row = 0; row < table.RowCount(); ++row) {
+            WriteRow(table.RowCells(row), table.columns.size(), out);
+        }
     } else if (const MetaList* list = AsList(&result)) {
         for (const MetaObject* element : PresentElements(*list)) out << Cell(ScalarText(*element)) << '\n';
     } else {

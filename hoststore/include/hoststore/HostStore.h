@@ -20,6 +20,7 @@
 #include <optional>
 #include <stdexcept>
 #include <string>
+#include <string_view>
 #include <unordered_map>
 #include <vector>
 
@@ -186,6 +187,11 @@ public:
     std::optional<std::string> GetText(const std::string& section, const std::string& key);
     std::vector<std::string> ListText(const std::string& section);
     std::vector<std::string> ListChildrenText(const std::string& section, const std::string& parent);
+    // The same objects handed to `visit` one at a time, in their order, each
+    // text valid only during its call: a listing of thousands decodes them
+    // without holding or copying them all.
+    void EachChildText(const std::string& section, const std::string& parent,
+                       const std::function<void(std::string_view)>& visit);
     std::vector<std::string> ListByParentOrderText(const std::string& section);
     // "{}" when the singleton was never written.
     std::string GetSingletonText(const std::string& name);

@@ -7,6 +7,10 @@
 
 #include <algorithm>
 #include <array>
+#include <cstdint>
+#include <string_view>
+#include <tuple>
+#include <type_traits>
 #include <unordered_map>
 
 #include "network/dvs/DvsRecords.h"
@@ -15,10 +19,23 @@
 namespace PldCtl {
 namespace Detail {
 
-// Canonical network text to the stored source of its route.
+// The stored sources of the IPv4 routes of the netstack listed last, for
+// the source column a listing asks for route by route. Each entry is a
+// network's key (see SourceKey) with the index of its source text; entries
+// are sorted by key, and of several routes to one network the first stored
+// one counts. The snapshot holds every route of that listing, so a network
+// it lacks has no route; any change drops it.
 struct RouteSources {
     std::string netstack;
-    std::unordered_map<std::string, std::string> byNetwork;
+    bool complete = false;
+    std::vector<std::pair<std::uint64_t, std::uint32_t>> byNetwork;
+    std::vector<std::string> texts;
+
+    void Clear() {
+        complete = false;
+        byNetwork.clear();
+        texts.clear();
+    }
 };
 
 }  // namespace Detail
@@ -55,6 +72,13 @@ struct V4 {
         return {Ipv4Network(address, Ipv4Network::PrefixFromNetmask(mask)).Masked()};
     }
     static bool IsLinkLocal(const Address&) { return false; }
+    // Orders a listing: the default route first, then by network address
+    // and prefix length.
+    static std::uint64_t SortKey(const Network& network) {
+        return std::uint64_t{network.GetPrefixLength() != 0} << 40 |
+               std::uint64_t{network.GetNetwork().ToUint32()} << 8 |
+               static_cast<std::uint64_t>(network.GetPrefixLength());
+    }
 };
 
 struct V6 {
@@ -75,6 +99,9 @@ struct V6 {
         return networks;
     }
     static bool IsLinkLocal(const Address& gateway) { return gateway.IsLinkLocal(); }
+    static std::tuple<bool, Ipv6Address::Bytes, int> SortKey(const Network& network) {
+        return {network.GetPrefixLength() != 0, network.GetAddress().GetBytes(), network.GetPrefixLength()};
+    }
 };
 
 std::string Text(const Ipv4Network& network) {
@@ -219,35 +246,76 @@ void RemoveRoute(const char* operation, const std::string& netstack, const typen
 }
 
 // The family's routes, the default route first, then by network.
+// A listing in its order: the default route first, then by network; routes
+// to one network keep their stored order. Each route's key is worked out
+// once and the keys are sorted, not the routes themselves; stored routes
+// are often in order already.
+template <typename F>
+std::vector<typename F::Route> InListingOrder(std::vector<typename F::Route> routes) {
+    using Key = decltype(F::SortKey(routes.front().network));
+    std::vector<std::pair<Key, std::uint32_t>> order;
+    order.reserve(routes.size());
+    for (std::size_t i = 0; i < routes.size(); ++i) {
+        order.emplace_back(F::SortKey(routes[i].network), static_cast<std::uint32_t>(i));
+    }
+    if (std::is_sorted(order.begin(), order.end())) return routes;
+    // The index makes every pair unique, so the order is stable.
+    std::sort(order.begin(), order.end());
+    std::vector<typename F::Route> sorted;
+    sorted.reserve(routes.size());
+    for (const auto& entry : order) sorted.push_back(std::move(routes[entry.second]));
+    return sorted;
+}
+
+// One number per IPv4 network as the store knows it (host bits cleared):
+// its address, then its prefix length.
+std::uint64_t SourceKey(const Ipv4Network& network) {
+    return std::uint64_t{network.Masked().GetNetwork().ToUint32()} << 8 |
+           static_cast<std::uint64_t>(network.GetPrefixLength());
+}
+
+// Keeps the source of each listed IPv4 route for GetDefaultGatewaySource.
+// Sources are few distinct words, kept once each.
+template <typename Route>
+void RememberSources(Detail::RouteSources& sources, const std::string& netstack, const std::vector<Route>& routes,
+                     std::vector<std::string>& sourceOf) {
+    sources.Clear();
+    sources.netstack = netstack;
+    if constexpr (std::is_same_v<Route, Ipv4Route>) {
+        sources.byNetwork.reserve(routes.size());
+        for (std::size_t i = 0; i < routes.size(); ++i) {
+            auto known = std::find(sources.texts.begin(), sources.texts.end(), sourceOf[i]);
+            if (known == sources.texts.end()) known = sources.texts.insert(known, std::move(sourceOf[i]));
+            sources.byNetwork.emplace_back(SourceKey(routes[i].network),
+                                           static_cast<std::uint32_t>(known - sources.texts.begin()));
+        }
+        // Stable, so the first stored route to a network comes first.
+        std::stable_sort(sources.byNetwork.begin(), sources.byNetwork.end(),
+                         [](const auto& a, const auto& b) { return a.first < b.first; });
+        sources.complete = true;
+    }
+}
+
 template <typename F>
 std::vector<typename F::Route> ListRoutes(const char* operation, const std::string& netstack,
                                           Detail::RouteSources* sources) {
     Store::HostStore& store = Detail::EnterOperation(operation, netstack);
-    std::vector<std::string> texts;
+    std::vector<typename F::Route> routes;
+    std::vector<std::string> sourceOf;
     store.Read([&](Store::Transaction& t) {
         RequireNetstackExists(t, netstack);
-        texts = t.ListChildrenText(RouteRecord::kSection, netstack);
+        // Decoded as SQLite hands each route over, without a copy of every
+        // stored text first.
+        t.EachChildText(RouteRecord::kSection, netstack, [&](std::string_view text) {
+            RouteRecord record = Detail::Decode<RouteRecord>(text);
+            if (record.IsIpv6() != F::kIpv6) return;
+            routes.push_back(typename F::Route{typename F::Network(record.network), typename F::Address(record.gateway),
+                                               std::move(record.interfaceName)});
+            if (sources) sourceOf.push_back(std::move(record.source));
+        });
     });
-    std::vector<typename F::Route> routes;
-    routes.reserve(texts.size());
-    if (sources) {
-        sources->netstack = netstack;
-        sources->byNetwork.clear();
-    }
-    for (std::string& text : texts) {
-        RouteRecord record = Detail::Decode<RouteRecord>(text);
-        std::string().swap(text);
-        if (record.IsIpv6() != F::kIpv6) continue;
-        typename F::Route route{typename F::Network(record.network), typename F::Address(record.gateway),
-                                std::move(record.interfaceName)};
-        if (sources) sources->byNetwork.emplace(Text(route.network), std::move(record.source));
-        routes.push_back(std::move(route));
-    }
-    std::stable_sort(routes.begin(), routes.end(), [](const auto& a, const auto& b) {
-        if (IsDefault(a.network) != IsDefault(b.network)) return IsDefault(a.network);
-        return a.network < b.network;
-    });
-    return routes;
+    if (sources) RememberSources(*sources, netstack, routes, sourceOf);
+    return InListingOrder<F>(std::move(routes));
 }
 
 // The gateway of the netstack's default route of the family; unspecified
@@ -351,16 +419,16 @@ RoutingInfoImpl::~RoutingInfoImpl() = default;
 
 void RoutingInfoImpl::SetNetstackInstanceKey(const std::string& netstack) {
     netstack_ = netstack;
-    sources_->byNetwork.clear();
+    sources_->Clear();
 }
 
 void RoutingInfoImpl::AddPalladRoute(const Ipv4Network& network, const Ipv4Address& gateway) {
-    sources_->byNetwork.clear();
+    sources_->Clear();
     AddRoute<V4>("RoutingInfoImpl::AddPalladRoute", netstack_, network, gateway);
 }
 
 void RoutingInfoImpl::RemovePalladRoute(const Ipv4Network& network, const Ipv4Address& gateway) {
-    sources_->byNetwork.clear();
+    sources_->Clear();
     RemoveRoute<V4>("RoutingInfoImpl::RemovePalladRoute", netstack_, network, gateway);
 }
 
@@ -377,20 +445,23 @@ Ipv4Address RoutingInfoImpl::GetPalladConfigDefaultGateway() {
 }
 
 void RoutingInfoImpl::SetPalladDefaultGateway(const Ipv4Address& gateway, bool) {
-    sources_->byNetwork.clear();
+    sources_->Clear();
     Store::HostStore& store = Detail::EnterOperation("RoutingInfoImpl::SetPalladDefaultGateway", netstack_);
     store.Change([&](Store::Transaction& t) { SetDefaultGateway<V4>(t, netstack_, gateway); });
 }
 
 std::string RoutingInfoImpl::GetDefaultGatewaySource(const Ipv4Network& network) {
     Store::HostStore& store = Detail::EnterOperation("RoutingInfoImpl::GetDefaultGatewaySource", netstack_);
-    const std::string networkText = Text(network);
-    if (sources_->netstack == netstack_) {
-        const auto known = sources_->byNetwork.find(networkText);
-        if (known != sources_->byNetwork.end()) return known->second;
-    }
     // Where no route says otherwise, the route's default source.
     std::string source = RouteRecord().source;
+    if (sources_->complete && sources_->netstack == netstack_) {
+        const std::uint64_t key = SourceKey(network);
+        const auto known = std::lower_bound(sources_->byNetwork.begin(), sources_->byNetwork.end(), key,
+                                            [](const auto& entry, std::uint64_t k) { return entry.first < k; });
+        if (known != sources_->byNetwork.end() && known->first == key) source = sources_->texts[known->second];
+        return source;
+    }
+    const std::string networkText = Text(network);
     store.Read([&](Store::Transaction& t) {
         RequireNetstackExists(t, netstack_);
         for (const RouteRecord& route : RoutesOf(t, netstack_)) {

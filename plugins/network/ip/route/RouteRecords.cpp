@@ -25,10 +25,12 @@ std::vector<std::string> Fields(RouteFamily family) {
 }
 
 void AppendIpv4Rows(MetaObj::MetaList& rows, RoutingInfoImpl& routing) {
-    for (const HostCtl::Network::Ipv4Route& route : routing.GetCurrentPalladRoutes()) {
+    const std::vector<HostCtl::Network::Ipv4Route> routes = routing.GetCurrentPalladRoutes();
+    rows.Reserve(routes.size());
+    for (const HostCtl::Network::Ipv4Route& route : routes) {
         // Fields are set in the record's own order, so a row needs no
         // template of placeholders first: a listing makes thousands of them.
-        boost::shared_ptr<MetaObj::MetaStruct> row = MetaObj::MetaStruct::New(RecordType(RouteFamily::Ipv4));
+        boost::shared_ptr<MetaObj::MetaStruct> row = MetaObj::MetaStruct::New(RecordType(RouteFamily::Ipv4), 5);
         row->SetField("Network", route.network == RoutingInfoImpl::DEFAULT_IPV4_ROUTE
                                      ? std::string("default")
                                      : route.network.GetNetwork().GetStringAddress());
@@ -41,8 +43,10 @@ void AppendIpv4Rows(MetaObj::MetaList& rows, RoutingInfoImpl& routing) {
 }
 
 void AppendIpv6Rows(MetaObj::MetaList& rows, RoutingInfoImpl& routing) {
-    for (const HostCtl::Network::Ipv6Route& route : routing.GetCurrentIpv6PalladRoutes()) {
-        boost::shared_ptr<MetaObj::MetaStruct> row = MetaObj::MetaStruct::New(RecordType(RouteFamily::Ipv6));
+    const std::vector<HostCtl::Network::Ipv6Route> routes = routing.GetCurrentIpv6PalladRoutes();
+    rows.Reserve(routes.size());
+    for (const HostCtl::Network::Ipv6Route& route : routes) {
+        boost::shared_ptr<MetaObj::MetaStruct> row = MetaObj::MetaStruct::New(RecordType(RouteFamily::Ipv6), 4);
         row->SetField("Network", route.network == RoutingInfoImpl::DEFAULT_IPV6_ROUTE
                                      ? std::string("default")
                                      : route.network.GetAddress().GetStringAddress());
