@@ -265,11 +265,14 @@ bool BuildTable(const MetaObject& result, const FormatHints& hints, const Inline
     }
 
     table.columns = ChooseColumns(records, elementTemplate, hints);
+    table.hints = &hints;
+    table.style = style;
     const std::size_t columnCount = table.columns.size();
     table.cells.clear();
     table.widths.clear();
     table.cells.reserve(records.size() * columnCount);
     table.widths.reserve(records.size() * columnCount);
+    std::string scratch;
     for (const MetaStruct* record : records) {
         const std::vector<MetaStruct::Field>& fields = record->GetFields();
         // Records usually hold their fields in the columns' order, so the
@@ -287,21 +290,35 @@ bool BuildTable(const MetaObject& result, const FormatHints& hints, const Inline
                     }
                 }
             }
-            std::string cell;
-            if (field) {
-                next = static_cast<std::size_t>(field - fields.data()) + 1;
-                if (IsPresent(field->second)) {
-                    AppendInlineText(cell, *field->second, record->GetTypeName(), field->first, hints, style);
-                }
-            }
-            table.widths.push_back(DisplayWidth(cell));
-            table.cells.push_back(std::move(cell));
+            if (field) next = static_cast<std::size_t>(field - fields.data()) + 1;
+            table.cells.push_back(field && IsPresent(field->second) ? field : nullptr);
         }
+    }
+    table.records = std::move(records);
+    for (std::size_t row = 0; row < table.RowCount(); ++row) {
+        for (std::size_t i = 0; i < columnCount; ++i) table.widths.push_back(DisplayWidth(table.CellText(row, i, scratch)));
     }
     return true;
 }
 
-std::size_t DisplayWidth(const std::string& text) {
+std::string_view Table::CellText(std::size_t row, std::size_t column, std::string& scratch) const {
+    const MetaStruct::Field* field = cells[row * columns.size() + column];
+    if (!field) return std::string_view();
+    // A string with no unit to add and nothing to escape is its own text.
+    if (!style.units && field->second->GetType() == MetaObj::META_STRING) {
+        const std::string& value = static_cast<const MetaObj::MetaString&>(*field->second).GetValue();
+        const bool plain = !style.escapeControls || std::all_of(value.begin(), value.end(), [](char c) {
+            const auto byte = static_cast<unsigned char>(c);
+            return byte >= 0x20 && byte < 0x7F;
+        });
+        if (plain) return value;
+    }
+    scratch.clear();
+    AppendInlineText(scratch, *field->second, records[row]->GetTypeName(), field->first, *hints, style);
+    return scratch;
+}
+
+std::size_t DisplayWidth(std::string_view text) {
     // Most text is ASCII, one character a byte.
     if (std::all_of(text.begin(), text.end(), [](char c) { return static_cast<unsigned char>(c) < 0x80; })) {
         return text.size();

@@ -8,6 +8,7 @@
 #include <cstddef>
 #include <optional>
 #include <string>
+#include <string_view>
 #include <vector>
 
 #include "framework/Format.h"
@@ -80,22 +81,30 @@ std::string InlineText(const MetaObjectPtr& value, const std::string& type, cons
 void AppendInlineText(std::string& out, const MetaObject& value, const std::string& type, const std::string& field,
                       const FormatHints& hints, const InlineStyle& style);
 
-// A result laid out as columns and rows of cell text, for table and csv.
-// The cells are kept row by row in one array, `columns.size()` to a row,
-// each with its display width: a listing of ten thousand rows makes no
-// array per row and measures each cell once.
+// A result laid out as columns and rows, for table and csv. Each cell is the
+// field its row has for its column (null when it has none) with the display
+// width of its text; the text itself is made when the cell is written, so a
+// listing of ten thousand rows copies no string into a table first.
 struct Table {
     std::vector<std::string> columns;
-    std::vector<std::string> cells;
+    // One per row.
+    std::vector<const MetaStruct*> records;
+    // `columns.size()` per row, row by row.
+    std::vector<const MetaStruct::Field*> cells;
     std::vector<std::size_t> widths;
+    const FormatHints* hints = nullptr;
+    InlineStyle style{", ", false, false};
 
-    std::size_t RowCount() const { return columns.empty() ? 0 : cells.size() / columns.size(); }
-    const std::string* RowCells(std::size_t row) const { return cells.data() + row * columns.size(); }
-    const std::size_t* RowWidths(std::size_t row) const { return widths.data() + row * columns.size(); }
+    std::size_t RowCount() const { return records.size(); }
+    std::size_t CellWidth(std::size_t row, std::size_t column) const { return widths[row * columns.size() + column]; }
+    // A cell's text: a plain string as it is, anything else made in
+    // `scratch` (valid until the next call with the same scratch).
+    std::string_view CellText(std::size_t row, std::size_t column, std::string& scratch) const;
 };
 
 // Lays out a record (one row) or a list of records. Returns false for any
-// other result, which the caller renders in its own way.
+// other result, which the caller renders in its own way. The table refers to
+// the result and the hints, which must outlive it.
 bool BuildTable(const MetaObject& result, const FormatHints& hints, const InlineStyle& style, Table& table);
 
 // The UTF-8 rules every formatter follows; AppendEscapedControls and
@@ -126,7 +135,7 @@ std::string Recode(const std::string& text, Replace replace) {
 }
 
 // The number of characters of a text, for lining up columns.
-std::size_t DisplayWidth(const std::string& text);
+std::size_t DisplayWidth(std::string_view text);
 
 // The work of each formatter, given a present result (never null, never a
 // scalar template). Formatters.cpp binds them to their names.

@@ -19,10 +19,10 @@ std::string Cell(const std::string& text) {
     return quoted + '"';
 }
 
-void WriteRow(const std::string* cells, std::size_t count, std::ostream& out) {
+void WriteRow(const std::vector<std::string>& cells, std::ostream& out) {
     const char* separator = "";
-    for (const std::string* cell = cells; cell != cells + count; ++cell) {
-        out << separator << Cell(*cell);
+    for (const auto& cell : cells) {
+        out << separator << Cell(cell);
         separator = ",";
     }
     out << '\n';
@@ -34,9 +34,12 @@ void WriteCsv(const MetaObject& result, const FormatHints& hints, std::ostream& 
     Table table;
     if (BuildTable(result, hints, kCsvStyle, table)) {
         if (table.columns.empty()) return;
-        WriteRow(table.columns.data(), table.columns.size(), out);
+        WriteRow(table.columns, out);
+        std::vector<std::string> cells(table.columns.size());
+        std::string scratch;
         for (std::size_t row = 0; row < table.RowCount(); ++row) {
-            WriteRow(table.RowCells(row), table.columns.size(), out);
+            for (std::size_t i = 0; i < cells.size(); ++i) cells[i] = table.CellText(row, i, scratch);
+            WriteRow(cells, out);
         }
     } else if (const MetaList* list = AsList(&result)) {
         for (const MetaObject* element : PresentElements(*list)) out << Cell(ScalarText(*element)) << '\n';

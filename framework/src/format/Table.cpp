@@ -3,7 +3,8 @@
 #include "Common.h"
 
 #include <algorithm>
-#include <cstring>
+#include <string_view>
+#include <utility>
 
 namespace AutoCli {
 namespace Formatting {
@@ -14,26 +15,18 @@ const InlineStyle kTableStyle{", ", true, true};
 const char kColumnGap[] = "  ";
 const std::size_t kFlushSize = 32 * 1024;
 
-void AppendRow(std::string& text, const std::string* cells, const std::size_t* cellWidths, std::size_t count,
-               const std::vector<std::size_t>& widths) {
-    // The row is laid out in room made for it at once: blanks everywhere,
-    // then each cell's text at its column. A padded cell takes the bytes of
-    // its text plus the blanks its width lacks.
+// Appends one row, each cell padded to its column's width with blanks, the
+// columns two blanks apart. `cell(i)` gives the text and display width of
+// cell i.
+template <typename Cell>
+void AppendRow(std::string& text, std::size_t count, const std::vector<std::size_t>& widths, Cell cell) {
     const std::size_t gap = sizeof kColumnGap - 1;
-    std::size_t length = 0;
-    for (std::size_t i = 0; i < count; ++i) {
-        if (i > 0) length += gap;
-        length += cells[i].size();
-        if (i + 1 < count) length += widths[i] - cellWidths[i];
-    }
     const std::size_t start = text.size();
-    text.resize(start + length, ' ');
-    std::size_t pos = start;
     for (std::size_t i = 0; i < count; ++i) {
-        if (i > 0) pos += gap;
-        std::memcpy(&text[pos], cells[i].data(), cells[i].size());
-        pos += cells[i].size();
-        if (i + 1 < count) pos += widths[i] - cellWidths[i];
+        if (i > 0) text.append(gap, ' ');
+        const auto [cellText, cellWidth] = cell(i);
+        text.append(cellText);
+        if (i + 1 < count) text.append(widths[i] - cellWidth, ' ');
     }
     // Empty cells at the end of a row would otherwise leave the padding and
     // gaps before them hanging.
@@ -54,13 +47,10 @@ void WriteTable(const MetaObject& result, const FormatHints& hints, std::ostream
 
     const std::size_t count = table.columns.size();
     std::vector<std::size_t> widths;
-    std::vector<std::size_t> headerWidths;
     std::vector<std::string> dashes;
-    for (std::size_t i = 0; i < count; ++i) headerWidths.push_back(DisplayWidth(table.columns[i]));
-    widths = headerWidths;
+    for (std::size_t i = 0; i < count; ++i) widths.push_back(DisplayWidth(table.columns[i]));
     for (std::size_t row = 0; row < table.RowCount(); ++row) {
-        const std::size_t* cellWidths = table.RowWidths(row);
-        for (std::size_t i = 0; i < count; ++i) widths[i] = std::max(widths[i], cellWidths[i]);
+        for (std::size_t i = 0; i < count; ++i) widths[i] = std::max(widths[i], table.CellWidth(row, i));
     }
     for (std::size_t width : widths) dashes.emplace_back(width, '-');
     // Rows are gathered and written out in pieces of a few kilobytes.
@@ -69,10 +59,16 @@ void WriteTable(const MetaObject& result, const FormatHints& hints, std::ostream
         out.write(text.data(), static_cast<std::streamsize>(text.size()));
         text.clear();
     };
-    AppendRow(text, table.columns.data(), headerWidths.data(), count, widths);
-    AppendRow(text, dashes.data(), widths.data(), count, widths);
+    AppendRow(text, count, widths, [&](std::size_t i) {
+        return std::pair<std::string_view, std::size_t>(table.columns[i], DisplayWidth(table.columns[i]));
+    });
+    AppendRow(text, count, widths,
+              [&](std::size_t i) { return std::pair<std::string_view, std::size_t>(dashes[i], widths[i]); });
+    std::string scratch;
     for (std::size_t row = 0; row < table.RowCount(); ++row) {
-        AppendRow(text, table.RowCells(row), table.RowWidths(row), count, widths);
+        AppendRow(text, count, widths, [&](std::size_t i) {
+            return std::pair<std::string_view, std::size_t>(table.CellText(row, i, scratch), table.CellWidth(row, i));
+        });
         if (text.size() >= kFlushSize) flush();
     }
     flush();
