@@ -2,7 +2,10 @@
 // command understands (--help, --formatter, --version), parse and check the
 // command's own arguments, execute, render, and map the outcome to an exit
 // status. This is the only place that decides exit statuses.
+#include <algorithm>
+#include <memory>
 #include <sstream>
+#include <streambuf>
 
 #include "format/Common.h"
 #include "framework/Format.h"
@@ -99,6 +102,68 @@ CommandLine Resolve(const boost::shared_ptr<NamespaceNode>& root, const std::vec
     return line;
 }
 
+// An output buffer that grows by whole chunks and never moves what it holds:
+// a listing renders to hundreds of kilobytes, which a single growing string
+// would copy each time it doubled. Chunks start small, for the many commands
+// that print a few lines, and double up to a limit.
+class ChunkBuffer : public std::streambuf {
+public:
+    ChunkBuffer() { NewChunk(); }
+
+    // Writes what was rendered; nothing for an empty rendering, which would
+    // otherwise mark `out` as failed.
+    void WriteTo(std::ostream& out) {
+        chunks_.back().used = static_cast<std::size_t>(pptr() - pbase());
+        for (const Chunk& chunk : chunks_) {
+            if (chunk.used > 0) out.write(chunk.text.get(), static_cast<std::streamsize>(chunk.used));
+        }
+    }
+
+protected:
+    int_type overflow(int_type c) override {
+        if (traits_type::eq_int_type(c, traits_type::eof())) return traits_type::not_eof(c);
+        NewChunk();
+        *pptr() = traits_type::to_char_type(c);
+        pbump(1);
+        return c;
+    }
+
+    std::streamsize xsputn(const char* text, std::streamsize count) override {
+        std::streamsize written = 0;
+        while (written < count) {
+            if (pptr() == epptr()) NewChunk();
+            const std::streamsize room = std::min<std::streamsize>(epptr() - pptr(), count - written);
+            traits_type::copy(pptr(), text + written, static_cast<std::size_t>(room));
+            pbump(static_cast<int>(room));
+            written += room;
+        }
+        return written;
+    }
+
+private:
+    static constexpr std::size_t kFirstChunkSize = 4 * 1024;
+    static constexpr std::size_t kLargestChunkSize = 256 * 1024;
+
+    struct Chunk {
+        // Left uninitialised: a page is touched only when text reaches it.
+        std::unique_ptr<char[]> text;
+        std::size_t used = 0;
+    };
+
+    void NewChunk() {
+        std::size_t size = kFirstChunkSize;
+        if (!chunks_.empty()) {
+            chunks_.back().used = static_cast<std::size_t>(pptr() - pbase());
+            size = std::min(kLargestChunkSize, 2 * static_cast<std::size_t>(epptr() - pbase()));
+        }
+        chunks_.push_back(Chunk{std::unique_ptr<char[]>(new char[size]), 0});
+        char* begin = chunks_.back().text.get();
+        setp(begin, begin + size);
+    }
+
+    std::vector<Chunk> chunks_;
+};
+
 int Execute(Command& command, const CommandLine& line, std::ostream& out, std::ostream& err,
             const RunOptions& options) {
     const std::string path = JoinPath(line.pathWords);
@@ -141,13 +206,10 @@ int Execute(Command& command, const CommandLine& line, std::ostream& out, std::o
         }
         // Rendered to a buffer first, so a formatter failure never leaves
         // half a document on stdout.
-        std::stringstream rendered;
+        ChunkBuffer buffer;
+        std::ostream rendered(&buffer);
         formatter->Render(result, FormatHints(command.GetDefaultOutputParameters()), rendered);
-        // Handed over from the buffer itself (hence a stream that can also be
-        // read) rather than from a copy of it: a listing renders to hundreds
-        // of kilobytes. Nothing is handed over for an empty rendering, which
-        // would otherwise mark `out` as failed.
-        if (rendered.tellp() > 0) out << rendered.rdbuf();
+        buffer.WriteTo(out);
     }
     for (const auto& message : output->GetErrors()) err << EscapeControls(message) << "\n";
     if (options.exitsAfterRun) {
