@@ -1,7 +1,10 @@
 #include "framework/MetaObj.h"
 
 #include <limits>
+#include <memory>
+#include <new>
 #include <stdexcept>
+#include <type_traits>
 #include <utility>
 
 #include <boost/make_shared.hpp>
@@ -88,10 +91,34 @@ boost::shared_ptr<MetaStruct> MetaStruct::New(const std::string& typeName) {
     return boost::make_shared<MetaStruct>(Token(), typeName);
 }
 
+struct MetaStruct::StringBlock {
+    using Slot = std::aligned_storage_t<sizeof(MetaString), alignof(MetaString)>;
+
+    explicit StringBlock(std::size_t size) : slots(new Slot[size]), capacity(size) {}
+    ~StringBlock() {
+        for (std::size_t i = count; i-- > 0;) reinterpret_cast<MetaString*>(&slots[i])->~MetaString();
+    }
+    StringBlock(const StringBlock&) = delete;
+    StringBlock& operator=(const StringBlock&) = delete;
+
+    std::unique_ptr<Slot[]> slots;
+    std::size_t capacity;
+    std::size_t count = 0;
+};
+
 boost::shared_ptr<MetaStruct> MetaStruct::New(const std::string& typeName, std::size_t fieldCount) {
     boost::shared_ptr<MetaStruct> record = boost::make_shared<MetaStruct>(Token(), typeName);
     record->fields_.reserve(fieldCount);
+    if (fieldCount > 0) record->strings_ = boost::make_shared<StringBlock>(fieldCount);
     return record;
+}
+
+MetaObjectPtr MetaStruct::NewString(std::string&& value) {
+    if (!strings_ || strings_->count == strings_->capacity) return MetaString::New(std::move(value));
+    auto* string = new (&strings_->slots[strings_->count]) MetaString(Token(), std::move(value));
+    ++strings_->count;
+    // Shares the block's ownership while pointing at the string in it.
+    return MetaObjectPtr(strings_, string);
 }
 
 void MetaStruct::Put(const std::string& name, MetaObjectPtr&& value) {
@@ -119,13 +146,13 @@ void MetaStruct::SetField(const std::string& name, MetaObjectPtr&& value) {
 }
 
 void MetaStruct::SetField(const std::string& name, const std::string& value) {
-    Put(name, MetaString::New(value));
+    Put(name, NewString(std::string(value)));
 }
 void MetaStruct::SetField(const std::string& name, std::string&& value) {
-    Put(name, MetaString::New(std::move(value)));
+    Put(name, NewString(std::move(value)));
 }
 void MetaStruct::SetField(const std::string& name, const char* value) {
-    Put(name, MetaString::New(value ? value : ""));
+    Put(name, NewString(value ? value : ""));
 }
 void MetaStruct::SetField(const std::string& name, bool value) {
     Put(name, MetaBool::New(value));

@@ -492,3 +492,34 @@ TEST(TableFormatter, RecordsWithDifferentFields) {
 }
 
 }  // namespace
+
+namespace {
+
+TEST(MetaValues, StringsOfASizedRecordOutliveItAndOverflowItsBlock) {
+    // Two strings fit the record's block; the third gets one of its own, and
+    // a field set again keeps its place with the new value.
+    StructPtr sized = MetaStruct::New("Route", 2);
+    sized->SetField("Network", std::string("192.0.2.0"));
+    sized->SetField("Gateway", "198.51.100.1");
+    sized->SetField("Interface", std::string("a name longer than any short string buffer"));
+    sized->SetField("Gateway", std::string("198.51.100.2"));
+    StructPtr plain = MetaStruct::New("Route");
+    plain->SetField("Network", "192.0.2.0");
+    plain->SetField("Gateway", "198.51.100.2");
+    plain->SetField("Interface", "a name longer than any short string buffer");
+    for (const auto& formatter : FormatterNames()) {
+        EXPECT_EQ(Render(formatter, sized), Render(formatter, plain)) << formatter;
+    }
+
+    // A field's value taken out of the record stays valid after the record
+    // and every other reference to the block are gone.
+    MetaObjectPtr network = sized->GetField("Network");
+    MetaObjectPtr interfaceName = sized->GetField("Interface");
+    sized.reset();
+    ASSERT_EQ(network->GetType(), MetaObj::META_STRING);
+    EXPECT_EQ(boost::static_pointer_cast<MetaObj::MetaString>(network)->GetValue(), "192.0.2.0");
+    EXPECT_EQ(boost::static_pointer_cast<MetaObj::MetaString>(interfaceName)->GetValue(),
+              "a name longer than any short string buffer");
+}
+
+}  // namespace

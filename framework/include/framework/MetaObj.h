@@ -54,6 +54,7 @@ using MetaObjectPtr = boost::shared_ptr<MetaObject>;
 class AUTOCLI_EXPORT MetaString : public MetaObject {
 public:
     explicit MetaString(Token) {}
+    MetaString(Token, std::string&& value) : value_(std::move(value)), hasValue_(true) {}
     static boost::shared_ptr<MetaString> New();
     static boost::shared_ptr<MetaString> New(const std::string& value);
     static boost::shared_ptr<MetaString> New(std::string&& value);
@@ -141,9 +142,18 @@ public:
 private:
     // Sets a field to a value known not to be null.
     void Put(const std::string& name, MetaObjectPtr&& value);
+    // A string value for a field: in the record's block while it has room,
+    // else one of its own.
+    MetaObjectPtr NewString(std::string&& value);
+
+    // The strings of a record made with a field count live side by side in
+    // one block, which the fields pointing into it keep alive, instead of
+    // being allocated one by one.
+    struct StringBlock;
 
     std::string typeName_;
     std::vector<Field> fields_;
+    boost::shared_ptr<StringBlock> strings_;
 };
 
 // A list of strings (META_STRING) or of records (META_STRUCT). The element

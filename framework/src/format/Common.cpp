@@ -296,7 +296,8 @@ bool BuildTable(const MetaObject& result, const FormatHints& hints, const Inline
     }
     table.records = std::move(records);
     for (std::size_t row = 0; row < table.RowCount(); ++row) {
-        for (std::size_t i = 0; i < columnCount; ++i) table.widths.push_back(DisplayWidth(table.CellText(row, i, scratch)));
+        for (std::size_t i = 0; i < columnCount; ++i)
+            table.widths.push_back(DisplayWidth(table.CellText(row, i, scratch)));
     }
     return true;
 }
