@@ -30,26 +30,28 @@ boost::shared_ptr<MetaObj::MetaStruct> FirewallGet::GetOutputStructure() {
 
 void FirewallGet::ExecuteInternal(boost::shared_ptr<CallSpec::Input>, boost::shared_ptr<CallSpec::Output> output) {
     PldCtl::System::SystemInfoImpl info;
-    ReportingHostErrors(
-        output,
-        [&] {
-            PldCtl::System::ModuleImpl module(PldCtl::System::kFirewallModule);
-            boost::shared_ptr<MetaObj::MetaStruct> record = GetOutputStructure();
-            // The firewall is asked only while its module is loaded; an
-            // unloaded firewall filters nothing and passes everything.
-            const bool loaded = module.IsLoaded();
-            bool enabled = false;
-            bool pass = true;
-            if (loaded) {
-                enabled = info.IsFirewallEnabled();
-                pass = info.GetFirewallDefaultAction();
-            }
-            record->SetField("Loaded", loaded);
-            record->SetField("Enabled", enabled);
-            record->SetField("DefaultAction", DefaultActionWord(pass));
-            Finish(output, record);
-        },
-        "Unable to get firewall status.\n");
+    try {
+        PldCtl::System::ModuleImpl module(PldCtl::System::kFirewallModule);
+        boost::shared_ptr<MetaObj::MetaStruct> record = GetOutputStructure();
+        // The firewall is asked only while its module is loaded; an unloaded
+        // firewall filters nothing and passes everything.
+        const bool loaded = module.IsLoaded();
+        bool enabled = false;
+        bool pass = true;
+        if (loaded) {
+            enabled = info.IsFirewallEnabled();
+            pass = info.GetFirewallDefaultAction();
+        }
+        record->SetField("Loaded", loaded);
+        record->SetField("Enabled", enabled);
+        record->SetField("DefaultAction", DefaultActionWord(pass));
+        Finish(output, record);
+    } catch (const HostCtl::Lib::HostCtlException& e) {
+        // The summary and the library's reason on lines of their own: the
+        // CLI shows each error on one line, escaping a line break inside it.
+        output->SetError("Unable to get firewall status.");
+        output->SetError(e.GetMessage(0));
+    }
 }
 
 }  // namespace NetworkNamespace
