@@ -28,7 +28,7 @@ constexpr int kWorlds = 64;
 constexpr int kNics = 64;
 constexpr long long kPortBlock = 1LL << 24;
 constexpr int kRulesets = 200;
-constexpr int kRulesPerRuleset = 25;        // 5000 rules
+constexpr int kRulesPerRuleset = 25;       // 5000 rules
 constexpr int kAllowedIpsPerRuleset = 10;  // 2000 allowed addresses
 
 std::string Mac(int a, int b) {
@@ -155,7 +155,8 @@ void AddFirewall(Json& profile) {
                     {"portBegin", begin},
                     {"portEnd", end}};
     };
-    Json dynamicRules = Json::array({rule("inbound", "tcp", "dst", 8100, 8103), rule("outbound", "udp", "src", 902, 902)});
+    Json dynamicRules =
+        Json::array({rule("inbound", "tcp", "dst", 8100, 8103), rule("outbound", "udp", "src", 902, 902)});
     dynamicRules[0]["label"] = "migration-session-1";
     dynamicRules[1]["label"] = "console-session-2";
     profile["firewall"] = {
@@ -166,8 +167,8 @@ void AddFirewall(Json& profile) {
         Json rules = Json::array();
         for (int j = 0; j < kRulesPerRuleset; ++j) {
             const int port = 1024 + r * kRulesPerRuleset + j;
-            rules.push_back(rule(j % 2 ? "outbound" : "inbound", j % 3 ? "tcp" : "udp", j % 5 ? "dst" : "src", port,
-                                 port + j % 4));
+            rules.push_back(
+                rule(j % 2 ? "outbound" : "inbound", j % 3 ? "tcp" : "udp", j % 5 ? "dst" : "src", port, port + j % 4));
         }
         // Canonical text: three IPv4 and three IPv6 addresses, two networks
         // of each family.

@@ -162,7 +162,7 @@ std::string CanonicalAllowedIp(const std::string& text) {
 }
 
 std::unique_ptr<HostCtl::System::FirewallRuleset> MakeFirewallRuleset(const std::string& label,
-                                                                       std::optional<FirewallRulesetRecord> record) {
+                                                                      std::optional<FirewallRulesetRecord> record) {
     return std::make_unique<FirewallRulesetImpl>(label, std::move(record));
 }
 

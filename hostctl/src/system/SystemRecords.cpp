@@ -80,7 +80,8 @@ HostCtl::System::FirewallRule RuleOf(const FirewallRuleRecord& record) {
     rule.portType = record.portType == "src" ? FirewallRule::PORT_TYPE_SRC : FirewallRule::PORT_TYPE_DST;
     rule.portBegin = record.portBegin;
     rule.portEnd = record.portEnd ? *record.portEnd : record.portBegin;
-    rule.direction = record.direction == "outbound" ? FirewallRule::DIRECTION_OUTBOUND : FirewallRule::DIRECTION_INBOUND;
+    rule.direction =
+        record.direction == "outbound" ? FirewallRule::DIRECTION_OUTBOUND : FirewallRule::DIRECTION_INBOUND;
     rule.protocol = record.protocol == "udp" ? FirewallRule::PROTOCOL_UDP : FirewallRule::PROTOCOL_TCP;
     return rule;
 }

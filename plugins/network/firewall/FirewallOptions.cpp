@@ -11,8 +11,7 @@ using HostCtl::Lib::HostCtlException;
 
 void DeclareRulesetIdParameter(const boost::shared_ptr<CallSpec::InputSpec>& inputSpec, const std::string& description,
                                CallSpec::Required required) {
-    DeclareParameter(inputSpec, "ruleset-id", CallSpec::PARAM_STRING, "r", description,
-                     required);
+    DeclareParameter(inputSpec, "ruleset-id", CallSpec::PARAM_STRING, "r", description, required);
 }
 
 void RunAllowedIpChange(const CallSpec::Input& input, const boost::shared_ptr<CallSpec::Output>& output,
@@ -31,8 +30,8 @@ void RunAllowedIpChange(const CallSpec::Input& input, const boost::shared_ptr<Ca
     });
 }
 
-std::optional<std::string> ReaddDynamicRules(
-    PldCtl::System::SystemInfoImpl& info, const std::vector<std::unique_ptr<HostCtl::System::FirewallRule>>& rules) {
+std::optional<std::string> ReaddDynamicRules(PldCtl::System::SystemInfoImpl& info,
+                                             const std::vector<std::unique_ptr<HostCtl::System::FirewallRule>>& rules) {
     std::optional<std::string> firstFailure;
     for (const std::unique_ptr<HostCtl::System::FirewallRule>& rule : rules) {
         try {

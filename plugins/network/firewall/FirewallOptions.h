@@ -29,7 +29,7 @@ void RunAllowedIpChange(const CallSpec::Input& input, const boost::shared_ptr<Ca
 // does not stop the others: every rule is tried, and the message of the
 // first refusal is returned (none when all were added).
 std::optional<std::string> ReaddDynamicRules(PldCtl::System::SystemInfoImpl& info,
-                              const std::vector<std::unique_ptr<HostCtl::System::FirewallRule>>& rules);
+                                             const std::vector<std::unique_ptr<HostCtl::System::FirewallRule>>& rules);
 
 }  // namespace NetworkNamespace
 }  // namespace OrvixCli

@@ -63,8 +63,9 @@ const char* ProtocolWord(int protocol) {
 }
 
 boost::shared_ptr<MetaObj::MetaStruct> FirewallTemplate() {
-    return Record("Firewall",
-                  {{"Loaded", MetaObj::META_BOOL}, {"Enabled", MetaObj::META_BOOL}, {"DefaultAction", MetaObj::META_STRING}});
+    return Record(
+        "Firewall",
+        {{"Loaded", MetaObj::META_BOOL}, {"Enabled", MetaObj::META_BOOL}, {"DefaultAction", MetaObj::META_STRING}});
 }
 
 boost::shared_ptr<MetaObj::MetaStruct> RulesetTemplate() {

@@ -28,8 +28,7 @@ boost::shared_ptr<CallSpec::OutputSpec> FirewallRefresh::GetOutputSpecInternal()
     return OperationOutputSpec();
 }
 
-void FirewallRefresh::ExecuteInternal(boost::shared_ptr<CallSpec::Input>,
-                                      boost::shared_ptr<CallSpec::Output> output) {
+void FirewallRefresh::ExecuteInternal(boost::shared_ptr<CallSpec::Input>, boost::shared_ptr<CallSpec::Output> output) {
     PldCtl::System::SystemInfoImpl info;
     ReportingHostErrors(output, [&] {
         // Loading the rulesets drops the dynamic rules: they are saved first

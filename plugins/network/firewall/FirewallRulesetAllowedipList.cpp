@@ -30,8 +30,10 @@ boost::shared_ptr<MetaObj::MetaStruct> FirewallRulesetAllowedipList::GetOutputSt
     return AllowedIpTemplate();
 }
 
-void FirewallRulesetAllowedipList::ExecuteInternal(boost::shared_ptr<CallSpec::Input> input, boost::shared_ptr<CallSpec::Output> output) {
-    RunRulesetListing(*input, output, [this] { return GetOutputStructure(); }, AllowedIpRecord);
+void FirewallRulesetAllowedipList::ExecuteInternal(boost::shared_ptr<CallSpec::Input> input,
+                                                   boost::shared_ptr<CallSpec::Output> output) {
+    RunRulesetListing(
+        *input, output, [this] { return GetOutputStructure(); }, AllowedIpRecord);
 }
 
 }  // namespace NetworkNamespace

@@ -25,7 +25,8 @@ boost::shared_ptr<CallSpec::OutputSpec> FirewallRulesetAllowedipRemove::GetOutpu
     return OperationOutputSpec();
 }
 
-void FirewallRulesetAllowedipRemove::ExecuteInternal(boost::shared_ptr<CallSpec::Input> input, boost::shared_ptr<CallSpec::Output> output) {
+void FirewallRulesetAllowedipRemove::ExecuteInternal(boost::shared_ptr<CallSpec::Input> input,
+                                                     boost::shared_ptr<CallSpec::Output> output) {
     RunAllowedIpChange(*input, output, [](HostCtl::System::FirewallRuleset& ruleset, const std::string& address) {
         ruleset.RemoveAllowedIp(address);
     });

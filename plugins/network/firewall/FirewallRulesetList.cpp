@@ -30,8 +30,10 @@ boost::shared_ptr<MetaObj::MetaStruct> FirewallRulesetList::GetOutputStructure()
     return RulesetTemplate();
 }
 
-void FirewallRulesetList::ExecuteInternal(boost::shared_ptr<CallSpec::Input> input, boost::shared_ptr<CallSpec::Output> output) {
-    RunRulesetListing(*input, output, [this] { return GetOutputStructure(); }, RulesetRecord);
+void FirewallRulesetList::ExecuteInternal(boost::shared_ptr<CallSpec::Input> input,
+                                          boost::shared_ptr<CallSpec::Output> output) {
+    RunRulesetListing(
+        *input, output, [this] { return GetOutputStructure(); }, RulesetRecord);
 }
 
 }  // namespace NetworkNamespace

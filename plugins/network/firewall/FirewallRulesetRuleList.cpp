@@ -33,8 +33,10 @@ boost::shared_ptr<MetaObj::MetaStruct> FirewallRulesetRuleList::GetOutputStructu
     return PortRuleTemplate();
 }
 
-void FirewallRulesetRuleList::ExecuteInternal(boost::shared_ptr<CallSpec::Input> input, boost::shared_ptr<CallSpec::Output> output) {
-    RunRulesetListing(*input, output, [this] { return GetOutputStructure(); }, PortRuleRecords);
+void FirewallRulesetRuleList::ExecuteInternal(boost::shared_ptr<CallSpec::Input> input,
+                                              boost::shared_ptr<CallSpec::Output> output) {
+    RunRulesetListing(
+        *input, output, [this] { return GetOutputStructure(); }, PortRuleRecords);
 }
 
 }  // namespace NetworkNamespace

@@ -205,9 +205,12 @@ TEST_F(Firewall, DynamicRulesAreDroppedByLoadingAndByDestroying) {
     EXPECT_EQ(*rules[0], *info.GetFirewallDynamicRules()[0]);
     EXPECT_EQ(rules[1]->label, "session-2");
     EXPECT_EQ(rules[1]->protocol, FirewallRule::PROTOCOL_UDP);
-    EXPECT_EQ(Dump()["firewall"]["dynamicRules"][1],
-              (Json{{"label", "session-2"}, {"direction", "inbound"}, {"protocol", "udp"}, {"portType", "dst"},
-                    {"portBegin", 8100}, {"portEnd", 8103}}));
+    EXPECT_EQ(Dump()["firewall"]["dynamicRules"][1], (Json{{"label", "session-2"},
+                                                           {"direction", "inbound"},
+                                                           {"protocol", "udp"},
+                                                           {"portType", "dst"},
+                                                           {"portBegin", 8100},
+                                                           {"portEnd", 8103}}));
 
     info.DestroyFirewallFilters();
     EXPECT_TRUE(info.GetFirewallDynamicRules().empty());
@@ -333,9 +336,9 @@ TEST_F(Firewall, ChangesFromTwoObjectsAreBothKept) {
     first->AddAllowedIp("203.0.113.1");
     second->AddAllowedIp("203.0.113.2");
     second->Disable();
-    EXPECT_THAT(Stored("firewallRulesets", "name", "sshServer")["allowedIps"].get<std::vector<std::string>>(),
-                ElementsAre("2001:db8:10::/64", "192.0.2.0/24", "198.51.100.77", "2001:db8::5", "203.0.113.1",
-                            "203.0.113.2"));
+    EXPECT_THAT(
+        Stored("firewallRulesets", "name", "sshServer")["allowedIps"].get<std::vector<std::string>>(),
+        ElementsAre("2001:db8:10::/64", "192.0.2.0/24", "198.51.100.77", "2001:db8::5", "203.0.113.1", "203.0.113.2"));
     // The second saw the first's entry when it changed the ruleset.
     EXPECT_EQ(second->GetAllowedIpList()->ipv4Addresses.size(), 3u);
     EXPECT_EQ(MessageOf([&] { first->AddAllowedIp("203.0.113.2"); }),

@@ -47,8 +47,8 @@ std::vector<std::unique_ptr<FirewallRule>> Rules(std::initializer_list<const cha
 
 TEST(ReaddDynamicRules, TriesEveryRuleAndReportsTheFirstFailure) {
     RefusingFirewall firewall({"b", "d"});
-    const std::optional<std::string> failure = OrvixCli::NetworkNamespace::ReaddDynamicRules(
-        firewall, Rules({"a", "b", "c", "d", "e"}));
+    const std::optional<std::string> failure =
+        OrvixCli::NetworkNamespace::ReaddDynamicRules(firewall, Rules({"a", "b", "c", "d", "e"}));
     EXPECT_EQ(failure, std::optional<std::string>("refused b"));
     EXPECT_THAT(firewall.asked, ::testing::ElementsAre("a", "b", "c", "d", "e"));
     EXPECT_THAT(firewall.added, ::testing::ElementsAre("a", "c", "e"));
