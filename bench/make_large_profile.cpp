@@ -1,7 +1,8 @@
 // Writes a large host profile on stdout, for the benchmark: about 1000
 // standard switches with 4096 ports in all, 2000 port groups, 256 kernel
 // interfaces over 16 netstacks, 10000 IPv4 routes (and 256 IPv6 ones), 2000
-// neighbors, 5000 connections of 64 worlds and 64 NICs with their driver data.
+// neighbors, 5000 connections of 64 worlds, 64 NICs with their driver data
+// and 200 firewall rulesets with 5000 rules and 2000 allowed addresses.
 // Deterministic: the same profile every time.
 #include <cstdint>
 #include <cstdio>
@@ -26,6 +27,9 @@ constexpr int kConnections = 5000;
 constexpr int kWorlds = 64;
 constexpr int kNics = 64;
 constexpr long long kPortBlock = 1LL << 24;
+constexpr int kRulesets = 200;
+constexpr int kRulesPerRuleset = 25;       // 5000 rules
+constexpr int kAllowedIpsPerRuleset = 10;  // 2000 allowed addresses
 
 std::string Mac(int a, int b) {
     char text[18];
@@ -137,6 +141,59 @@ Json Nic(int n) {
         nic["sriovVfs"] = vfs;
     }
     return nic;
+}
+
+// The firewall: its module loaded, two dynamic rules, and rulesets with
+// rules of every kind and allowed lists mixing both families, addresses and
+// networks. Every fifth ruleset allows every address, every third is off.
+void AddFirewall(Json& profile) {
+    profile["system"]["modules"] = Json::array({{{"name", "tovrinfw"}, {"loaded", true}, {"options", ""}}});
+    const auto rule = [](const char* direction, const char* protocol, const char* portType, int begin, int end) {
+        return Json{{"direction", direction},
+                    {"protocol", protocol},
+                    {"portType", portType},
+                    {"portBegin", begin},
+                    {"portEnd", end}};
+    };
+    Json dynamicRules =
+        Json::array({rule("inbound", "tcp", "dst", 8100, 8103), rule("outbound", "udp", "src", 902, 902)});
+    dynamicRules[0]["label"] = "migration-session-1";
+    dynamicRules[1]["label"] = "console-session-2";
+    profile["firewall"] = {
+        {"enabled", true}, {"defaultAction", "DROP"}, {"rulesetsLoaded", true}, {"dynamicRules", dynamicRules}};
+    const char* ipv4Ranges[] = {"192.0.2", "198.51.100", "203.0.113"};
+    Json rulesets = Json::array();
+    for (int r = 0; r < kRulesets; ++r) {
+        Json rules = Json::array();
+        for (int j = 0; j < kRulesPerRuleset; ++j) {
+            const int port = 1024 + r * kRulesPerRuleset + j;
+            rules.push_back(
+                rule(j % 2 ? "outbound" : "inbound", j % 3 ? "tcp" : "udp", j % 5 ? "dst" : "src", port, port + j % 4));
+        }
+        // Canonical text: three IPv4 and three IPv6 addresses, two networks
+        // of each family.
+        char group[8];
+        std::snprintf(group, sizeof group, "%x", r + 1);
+        const std::string host = std::to_string(r % 254 + 1);
+        Json allowed = Json::array();
+        for (int k = 0; k < kAllowedIpsPerRuleset; ++k) {
+            if (k < 3) {
+                allowed.push_back(std::string(ipv4Ranges[k]) + "." + host);
+            } else if (k < 6) {
+                allowed.push_back("2001:db8:" + std::string(group) + "::" + std::to_string(k));
+            } else if (k < 8) {
+                allowed.push_back(std::string(ipv4Ranges[k - 5]) + "." + std::to_string(r % 16 * 16) + "/28");
+            } else {
+                allowed.push_back("2001:db8:" + std::string(group) + ":" + std::to_string(k) + "::/64");
+            }
+        }
+        rulesets.push_back({{"name", "ruleset" + std::to_string(r)},
+                            {"enabled", r % 3 != 0},
+                            {"allowedAll", r % 5 == 0},
+                            {"allowedIps", allowed},
+                            {"rules", rules}});
+    }
+    profile["firewallRulesets"] = rulesets;
 }
 
 Json Teaming(const Json& order) {
@@ -318,6 +375,7 @@ int main() {
     profile["connections"] = connections;
     profile["worlds"] = worlds;
     profile["ports"] = ports;
+    AddFirewall(profile);
     std::cout << profile.dump(1) << "\n";
     return 0;
 }

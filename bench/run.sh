@@ -51,7 +51,12 @@ echo "Default host ($runs runs each, $(nproc) cores):"
     "network ip connection list" "$cli network ip connection list" \
     "network ip dns server list" "$cli network ip dns server list" \
     "network ip route ipv4 add" "$cli network ip route ipv4 add -n 198.51.100.128/25 -g 192.0.2.1" \
-    "network ip route ipv4 remove" "$cli network ip route ipv4 remove -n 198.51.100.128/25 -g 192.0.2.1"
+    "network ip route ipv4 remove" "$cli network ip route ipv4 remove -n 198.51.100.128/25 -g 192.0.2.1" \
+    "network firewall get" "$cli network firewall get" \
+    "network firewall ruleset list" "$cli network firewall ruleset list" \
+    "network firewall ruleset rule list" "$cli network firewall ruleset rule list" \
+    "... ruleset allowedip add" "$cli network firewall ruleset allowedip add -r sshServer -i 203.0.113.250" \
+    "... ruleset allowedip remove" "$cli network firewall ruleset allowedip remove -r sshServer -i 203.0.113.250"
 
 # The kernel's own listing of as many routes, for comparison: a network
 # namespace made for this run (and deleted with it) holding 10000 routes on
@@ -75,7 +80,7 @@ export ORVIX_HOST_DB=$work/large.db
 "$bin/orvix-bench-make-profile" >"$work/large.json"
 "$bin/orvix-hostsim" init --profile "$work/large.json" >/dev/null
 echo
-echo "Large host: 1000 switches, 4096 ports, 2000 port groups, 64 NICs, 256 interfaces, 16 netstacks, 10000 routes, 2000 neighbors, 5000 connections ($runs runs each):"
+echo "Large host: 1000 switches, 4096 ports, 2000 port groups, 64 NICs, 256 interfaces, 16 netstacks, 10000 routes, 2000 neighbors, 5000 connections, 200 firewall rulesets with 5000 rules ($runs runs each):"
 "$bin/orvix-bench-timer" "$runs" \
     "baseline (dlopen + one call)" "$bin/orvix-bench-baseline" \
     "network ip get" "$cli network ip get" \
@@ -100,4 +105,9 @@ echo "Large host: 1000 switches, 4096 ports, 2000 port groups, 64 NICs, 256 inte
     "network ip connection list" "$cli network ip connection list" \
     "network ip dns server list" "$cli network ip dns server list" \
     "network ip route ipv4 add" "$cli network ip route ipv4 add -n 203.0.113.128/25 -g 198.51.100.2" \
-    "network ip route ipv4 remove" "$cli network ip route ipv4 remove -n 203.0.113.128/25 -g 198.51.100.2"
+    "network ip route ipv4 remove" "$cli network ip route ipv4 remove -n 203.0.113.128/25 -g 198.51.100.2" \
+    "network firewall get" "$cli network firewall get" \
+    "network firewall ruleset list" "$cli network firewall ruleset list" \
+    "network firewall ruleset rule list" "$cli network firewall ruleset rule list" \
+    "... ruleset allowedip add" "$cli network firewall ruleset allowedip add -r ruleset199 -i 203.0.113.250" \
+    "... ruleset allowedip remove" "$cli network firewall ruleset allowedip remove -r ruleset199 -i 203.0.113.250"

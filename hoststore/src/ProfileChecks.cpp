@@ -52,6 +52,7 @@ struct FieldCheck {
         Network,
         AddressList,
         SingleWordList,
+        AddressOrNetworkList,
     };
 
     const char* name;
@@ -108,6 +109,10 @@ FieldCheck Network(const char* name, int family) {
 }
 FieldCheck Addresses(const char* name) {
     return {name, FieldCheck::Kind::AddressList};
+}
+// Canonical addresses or networks of either family, mixed.
+FieldCheck AddressesOrNetworks(const char* name) {
+    return {name, FieldCheck::Kind::AddressOrNetworkList};
 }
 // Names shown joined by blanks: no blank or control character inside.
 FieldCheck SingleWords(const char* name) {
@@ -282,10 +287,34 @@ const FieldChecks kNic = {
     Nested("selfTest", kSelfTest),
     NestedList("sriovVfs", kVf),
 };
+const FieldChecks kModule = {Text("name"), Flag("loaded"), Text("options")};
 const FieldChecks kSystem = {
     Flag("ipv6Enabled"),
     Integer("maxPorts", 1, kInt64Max),
     Names("congestionControlAlgorithms"),
+    NestedList("modules", kModule),
+};
+// A port rule, of a ruleset or of the firewall's dynamic rules.
+const FieldChecks kFirewallRule = {
+    Text("label"),
+    Word("direction", {"inbound", "outbound"}),
+    Word("protocol", {"tcp", "udp"}),
+    Word("portType", {"dst", "src"}),
+    Integer("portBegin", 0, 65535),
+    Integer("portEnd", 0, 65535),
+};
+const FieldChecks kFirewall = {
+    Flag("enabled"),
+    Word("defaultAction", {"PASS", "DROP"}),
+    Flag("rulesetsLoaded"),
+    NestedList("dynamicRules", kFirewallRule),
+};
+const FieldChecks kFirewallRuleset = {
+    Text("name"),
+    Flag("enabled"),
+    Flag("allowedAll"),
+    AddressesOrNetworks("allowedIps"),
+    NestedList("rules", kFirewallRule),
 };
 const FieldChecks kDvPort = {Text("dvswitch"), Text("id"), Integer("connectionId", 0, kUint32Max)};
 const FieldChecks kNetstack = {
@@ -410,6 +439,8 @@ const FieldChecks* ChecksOf(const std::string& section) {
         {Section::kIpsec, &kIpsec},
         {Section::kIpsecSAs, &kSa},
         {Section::kIpsecSPs, &kSp},
+        {Section::kFirewall, &kFirewall},
+        {Section::kFirewallRulesets, &kFirewallRuleset},
     };
     for (const auto& [name, checks] : sections) {
         if (section == name) return checks;
@@ -616,6 +647,19 @@ std::string Mismatch(const FieldCheck& check, const Json& value, const std::stri
             return AddressMismatch(check, value);
         case FieldCheck::Kind::Network:
             return NetworkMismatch(check, value);
+        case FieldCheck::Kind::AddressOrNetworkList:
+            if (!value.is_array()) return "must be an array of strings" + found;
+            for (std::size_t i = 0; i < value.size(); ++i) {
+                if (value[i].is_string() && value[i].get_ref<const std::string&>().find('/') != std::string::npos) {
+                    const std::string why = NetworkMismatch(check, value[i]);
+                    if (!why.empty()) return "item " + std::to_string(i) + " " + why;
+                } else if (!AddressMismatch(check, value[i]).empty()) {
+                    return "item " + std::to_string(i) + " must be an IP address or an IP network address/prefix" +
+                           " in canonical text, not " +
+                           (value[i].is_string() ? "'" + value[i].get<std::string>() + "'" : value[i].type_name());
+                }
+            }
+            return "";
         case FieldCheck::Kind::AddressList:
         case FieldCheck::Kind::SingleWordList:
             if (!value.is_array()) return "must be an array of strings" + found;

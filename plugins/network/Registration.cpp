@@ -9,6 +9,17 @@
 // left untouched and no partial tree is ever visible.
 #include <boost/shared_ptr.hpp>
 
+#include "firewall/FirewallGet.h"
+#include "firewall/FirewallLoad.h"
+#include "firewall/FirewallRefresh.h"
+#include "firewall/FirewallRulesetAllowedipAdd.h"
+#include "firewall/FirewallRulesetAllowedipList.h"
+#include "firewall/FirewallRulesetAllowedipRemove.h"
+#include "firewall/FirewallRulesetList.h"
+#include "firewall/FirewallRulesetRuleList.h"
+#include "firewall/FirewallRulesetSet.h"
+#include "firewall/FirewallSet.h"
+#include "firewall/FirewallUnload.h"
 #include "framework/AutoCli.h"
 #include "ip/IpGet.h"
 #include "ip/IpSet.h"
@@ -423,27 +434,27 @@ extern "C" __attribute__((visibility("default"))) void AutoCli_RegisterNamespace
     // lacp: attached last of all, below
 
     // network firewall
-    // get: FirewallGet
-    // set: FirewallSet
-    // load: FirewallLoad
-    // refresh: FirewallRefresh
-    // unload: FirewallUnload
+    firewall->RegisterNamespaceNode(FirewallGet::New(), "get");
+    firewall->RegisterNamespaceNode(FirewallSet::New(), "set");
+    firewall->RegisterNamespaceNode(FirewallLoad::New(), "load");
+    firewall->RegisterNamespaceNode(FirewallRefresh::New(), "refresh");
+    firewall->RegisterNamespaceNode(FirewallUnload::New(), "unload");
     auto firewallRuleset = Attach(firewall, "ruleset", "Commands to list and update firewall ruleset configuration");
 
     // network firewall ruleset
-    // list: FirewallRulesetList
-    // set: FirewallRulesetSet
+    firewallRuleset->RegisterNamespaceNode(FirewallRulesetList::New(), "list");
+    firewallRuleset->RegisterNamespaceNode(FirewallRulesetSet::New(), "set");
     auto firewallRulesetRule = Attach(firewallRuleset, "rule", "Commands to list rules in the ruleset");
     auto firewallRulesetAllowedip =
         Attach(firewallRuleset, "allowedip", "Commands to list and add/remove allowedip on ruleset");
 
     // network firewall ruleset rule
-    // list: FirewallRulesetRuleList
+    firewallRulesetRule->RegisterNamespaceNode(FirewallRulesetRuleList::New(), "list");
 
     // network firewall ruleset allowedip
-    // list: FirewallRulesetAllowedipList
-    // add: FirewallRulesetAllowedipAdd
-    // remove: FirewallRulesetAllowedipRemove
+    firewallRulesetAllowedip->RegisterNamespaceNode(FirewallRulesetAllowedipList::New(), "list");
+    firewallRulesetAllowedip->RegisterNamespaceNode(FirewallRulesetAllowedipAdd::New(), "add");
+    firewallRulesetAllowedip->RegisterNamespaceNode(FirewallRulesetAllowedipRemove::New(), "remove");
 
     // network port
     auto portStats = Attach(port, "stats", "Commands to get port statistics");
