@@ -26,7 +26,7 @@ bool IsOperationName(const std::string& operation) {
 
 }  // namespace
 
-void HostStore::CheckFault(const std::string& operation, const std::string& key) {
+void HostStore::CheckFault(std::string_view operation, std::string_view key) {
     impl_->RequireIdle();
     if (impl_->noFaults) return;
     auto& db = impl_->db;
@@ -43,7 +43,7 @@ void HostStore::CheckFault(const std::string& operation, const std::string& key)
         auto query = db.Prepare(
             "SELECT id, message, remaining IS NOT NULL FROM fault "
             "WHERE operation = ?1 AND (key = '' OR key = ?2) ORDER BY id LIMIT 1");
-        if (!query.Bind(1, operation).Bind(2, key).Next()) return;
+        if (!query.Bind(1, std::string(operation)).Bind(2, std::string(key)).Next()) return;
         id = query.Int(0);
         message = query.Text(1);
         counted = query.Int(2) != 0;

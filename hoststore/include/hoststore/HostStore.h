@@ -305,7 +305,7 @@ public:
     // asked is taken to stay without (unless this process adds one), so the
     // check costs nothing on a host nobody tests; a fault armed by another
     // process meanwhile is seen by processes started later.
-    void CheckFault(const std::string& operation, const std::string& key = std::string());
+    void CheckFault(std::string_view operation, std::string_view key = std::string_view());
     std::vector<Fault> ListFaults();
     std::int64_t AddFault(const Fault& fault);
     void ClearFaults();

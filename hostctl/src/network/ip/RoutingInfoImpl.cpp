@@ -453,7 +453,8 @@ void RoutingInfoImpl::SetPalladDefaultGateway(const Ipv4Address& gateway, bool) 
 std::string RoutingInfoImpl::GetDefaultGatewaySource(const Ipv4Network& network) {
     Store::HostStore& store = Detail::EnterOperation("RoutingInfoImpl::GetDefaultGatewaySource", netstack_);
     // Where no route says otherwise, the route's default source.
-    std::string source = RouteRecord().source;
+    static const std::string kDefaultSource = RouteRecord().source;
+    std::string source = kDefaultSource;
     if (sources_->complete && sources_->netstack == netstack_) {
         const std::uint64_t key = SourceKey(network);
         const auto known = std::lower_bound(sources_->byNetwork.begin(), sources_->byNetwork.end(), key,
