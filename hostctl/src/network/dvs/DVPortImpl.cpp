@@ -35,6 +35,9 @@ std::optional<std::pair<Detail::DvSwitchRecord, Detail::DvPortRecord>> FindPort(
 }  // namespace
 
 DVPortImpl::DVPortImpl(const HostCtl::Network::DVPortParam& param) : param_(param) {}
+DVPortImpl::DVPortImpl(const HostCtl::Network::DVPortParam& param, std::shared_ptr<const Detail::DvPortRecord> record,
+                       std::vector<std::string> clients)
+    : param_(param), snapshot_(Snapshot{std::move(record), std::move(clients)}) {}
 DVPortImpl::~DVPortImpl() = default;
 
 std::uint32_t DVPortImpl::GetConnectionId() const {
@@ -76,6 +79,32 @@ bool DVPortImpl::IsValid() const {
     } catch (const std::exception&) {
         return false;
     }
+}
+
+const DVPortImpl::Snapshot& DVPortImpl::Stored() const {
+    if (!snapshot_) throw HostCtl::Lib::HostCtlException("DVPortImpl is not available yet");
+    return *snapshot_;
+}
+
+std::string DVPortImpl::GetPortId() const {
+    return param_.portId;
+}
+
+std::string DVPortImpl::GetDVPortgroupId() const {
+    return Stored().record->portgroupId;
+}
+
+bool DVPortImpl::IsInUse(std::vector<std::string>& clients) const {
+    clients = Stored().clients;
+    return !clients.empty();
+}
+
+bool DVPortImpl::IsLacpEnabled() const {
+    return Stored().record->lacpEnabled;
+}
+
+int DVPortImpl::GetLacpMode() const {
+    return Detail::LacpModeNumber(Stored().record->lacpMode);
 }
 
 }  // namespace Network
