@@ -13,7 +13,8 @@ namespace {
 using namespace OrvixCli::NetworkNamespace;
 
 TEST(PortStateNames, NamesTheSetBitsInBitOrderEachFollowedByAComma) {
-    EXPECT_EQ(PortStateNames(0x3D), "ACT,SYN,COL,DIST,");
+    // 0x3D is an active, aggregatable port in sync, collecting and distributing.
+    EXPECT_EQ(PortStateNames(0x3D), "ACT,AGG,SYN,COL,DIST,");
     EXPECT_EQ(PortStateNames(0), "");
     EXPECT_EQ(PortStateNames(0xFF), "ACT,FTO,AGG,SYN,COL,DIST,DEF,EXP,");
     // Short timeout and defaulted, as on a port whose partner went silent.

@@ -28,7 +28,7 @@ std::string LagConfigModeText(int mode);
 std::string LagStatusModeText(int mode);
 
 // An LACP actor or partner state byte as the names of its set bits, from
-// bit 0 to bit 7, each followed by a comma: 0x3D gives "ACT,SYN,COL,DIST,".
+// bit 0 to bit 7, each followed by a comma: 0x3D gives "ACT,AGG,SYN,COL,DIST,".
 // A zero byte gives an empty text.
 std::string PortStateNames(std::uint8_t state);
 
