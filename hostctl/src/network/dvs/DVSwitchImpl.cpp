@@ -217,13 +217,15 @@ void DVSwitchImpl::SetLacpTimeout(std::int64_t lagId, bool shortTimeout, const s
     Store::HostStore& store = Detail::EnterOperation("DVSwitchImpl::SetLacpTimeout", name);
     std::shared_ptr<const Detail::DvSwitchRecord> written;
     store.Change([&](Store::Transaction& t) {
-        std::optional<Detail::StoredObject<Detail::DvSwitchRecord>> stored = Detail::Find<Detail::DvSwitchRecord>(t, name);
+        std::optional<Detail::StoredObject<Detail::DvSwitchRecord>> stored =
+            Detail::Find<Detail::DvSwitchRecord>(t, name);
         if (!stored) throw HostCtl::Lib::HostCtlException(HostCtl::Network::DVSwitchNotFoundMessage(name));
         Detail::DvSwitchRecord edited = stored->record;
         auto lag = std::find_if(edited.lags.begin(), edited.lags.end(),
                                 [&](const Detail::LagRecord& candidate) { return candidate.id == lagId; });
         if (lag == edited.lags.end()) {
-            throw HostCtl::Lib::HostCtlException("LAG " + std::to_string(lagId) + " does not exist on DVSwitch " + name);
+            throw HostCtl::Lib::HostCtlException("LAG " + std::to_string(lagId) + " does not exist on DVSwitch " +
+                                                 name);
         }
         bool found = nic.empty();
         for (Detail::LagMemberRecord& member : lag->members) {
@@ -237,7 +239,8 @@ void DVSwitchImpl::SetLacpTimeout(std::int64_t lagId, bool shortTimeout, const s
             }
         }
         if (!found) {
-            throw HostCtl::Lib::HostCtlException("NIC " + nic + " is not in LAG " + std::to_string(lagId) + " of DVSwitch " + name);
+            throw HostCtl::Lib::HostCtlException("NIC " + nic + " is not in LAG " + std::to_string(lagId) +
+                                                 " of DVSwitch " + name);
         }
         Detail::Write(t, *stored, edited);
         written = std::make_shared<const Detail::DvSwitchRecord>(std::move(edited));

@@ -210,9 +210,8 @@ std::unique_ptr<Port> PnicImpl::GetUplinkPort() const {
     Store::HostStore& store = Detail::EnterOperation("PnicImpl::GetUplinkPort", name);
     std::unique_ptr<Port> port;
     store.Read([&](Store::Transaction& t) {
-        std::optional<Detail::NicRecord> nic = Detail::Get<Detail::NicRecord>(t, name);
-        if (!nic || nic->uplinkPortId == 0) return;
-        port = Detail::FindPort(t, nic->uplinkPortId);
+        const Detail::NicRecord nic = Detail::RequireNic(t, name);
+        if (nic.uplinkPortId != 0) port = Detail::FindPort(t, nic.uplinkPortId);
     });
     return port;
 }
