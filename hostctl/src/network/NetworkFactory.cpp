@@ -47,10 +47,5 @@ std::unique_ptr<DVSwitch> NetworkFactory::GetDVSwitchByName(const std::string& n
         std::make_shared<const DvSwitchRecord>(std::move(*dvswitch)));
 }
 
-std::unique_ptr<DVPort> NetworkFactory::GetDVPort(const DVPortParam& param) {
-    PldCtl::Detail::EnterOperation("NetworkFactory::GetDVPort", param.portId);
-    throw Lib::HostCtlException("NetworkFactory::GetDVPort is not available yet");
-}
-
 }  // namespace Network
 }  // namespace HostCtl

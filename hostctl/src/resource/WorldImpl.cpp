@@ -1,6 +1,8 @@
+// One running world over the host store.
 #include "hostctl/resource/WorldImpl.h"
 
-#include "network/port/Pending.h"
+#include "Operation.h"
+#include "resource/WorldRecords.h"
 
 namespace PldCtl {
 namespace Resource {
@@ -9,7 +11,10 @@ WorldImpl::WorldImpl(std::uint64_t id) : id_(id) {}
 WorldImpl::~WorldImpl() = default;
 
 std::string WorldImpl::GetWorldName() const {
-    Detail::NotAvailableYet("WorldImpl::GetWorldName");
+    const std::string key = std::to_string(id_);
+    Store::HostStore& store = Detail::EnterOperation("WorldImpl::GetWorldName", key);
+    std::optional<Detail::WorldRecord> world = Detail::Get<Detail::WorldRecord>(store, key);
+    return world ? world->name : std::string();
 }
 
 }  // namespace Resource

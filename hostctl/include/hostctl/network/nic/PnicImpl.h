@@ -5,8 +5,8 @@
 #include <string>
 
 #include "hostctl/Export.h"
-#include "hostctl/network/port/Port.h"
 #include "hostctl/network/nic/Pnic.h"
+#include "hostctl/network/port/Port.h"
 
 namespace PldCtl {
 namespace Detail {
