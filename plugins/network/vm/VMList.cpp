@@ -35,8 +35,7 @@ boost::shared_ptr<MetaObj::MetaStruct> VMList::GetOutputStructure() {
     return MetaObj::MetaStruct::New("VM");
 }
 
-void VMList::ExecuteInternal(boost::shared_ptr<CallSpec::Input> /*input*/,
-                             boost::shared_ptr<CallSpec::Output> output) {
+void VMList::ExecuteInternal(boost::shared_ptr<CallSpec::Input> /*input*/, boost::shared_ptr<CallSpec::Output> output) {
     PldCtl::Network::VirtualSwitchInfoImpl switchInfo;
     ReportingHostErrors(
         output,
@@ -44,10 +43,10 @@ void VMList::ExecuteInternal(boost::shared_ptr<CallSpec::Input> /*input*/,
             // The networks of each world, one name per port (repeats kept),
             // by ascending world id.
             std::map<std::uint64_t, std::vector<std::string>> networks;
-            ForEachWorldPort(switchInfo,
-                             [&](const std::string& /*switchName*/, SwitchKind kind, const HostCtl::Network::Port& port) {
-                                 networks[port.GetWorldId()].push_back(PortNetworkName(kind, port));
-                             });
+            ForEachWorldPort(switchInfo, [&](const std::string& /*switchName*/, SwitchKind kind,
+                                             const HostCtl::Network::Port& port) {
+                networks[port.GetWorldId()].push_back(PortNetworkName(kind, port));
+            });
 
             boost::shared_ptr<MetaObj::MetaList> records =
                 MetaObj::MetaList::New(MetaObj::META_STRUCT, GetOutputStructure());

@@ -2,6 +2,7 @@
 
 #include <cstdint>
 #include <string>
+#include <utility>
 
 #include "common/CommandSupport.h"
 #include "port/PortLookup.h"
@@ -37,8 +38,7 @@ boost::shared_ptr<MetaObj::MetaStruct> VMPortList::GetOutputStructure() {
     return MetaObj::MetaStruct::New("Port");
 }
 
-void VMPortList::ExecuteInternal(boost::shared_ptr<CallSpec::Input> input,
-                                 boost::shared_ptr<CallSpec::Output> output) {
+void VMPortList::ExecuteInternal(boost::shared_ptr<CallSpec::Input> input, boost::shared_ptr<CallSpec::Output> output) {
     PldCtl::Network::VirtualSwitchInfoImpl switchInfo;
     ReportingHostErrors(
         output,
@@ -48,22 +48,22 @@ void VMPortList::ExecuteInternal(boost::shared_ptr<CallSpec::Input> input,
             const std::int64_t worldId = IdFromText(input->GetString("world-id"));
             boost::shared_ptr<MetaObj::MetaList> records =
                 MetaObj::MetaList::New(MetaObj::META_STRUCT, GetOutputStructure());
-            ForEachWorldPort(switchInfo, [&](const std::string& switchName, SwitchKind kind,
-                                             const HostCtl::Network::Port& port) {
-                if (worldId <= 0 || port.GetWorldId() != static_cast<std::uint64_t>(worldId)) return;
-                boost::shared_ptr<MetaObj::MetaStruct> record = GetOutputStructure();
-                record->SetField("Port ID", port.GetPortId());
-                record->SetField("vSwitch", switchName);
-                record->SetField("Portgroup", PortNetworkName(kind, port));
-                record->SetField("DVPort ID", kind == SwitchKind::Distributed ? port.GetDVPortId() : std::string());
-                record->SetField("MAC Address", port.GetMacAddress().GetStringAddress());
-                record->SetField("IP Address", port.GetIpAddress().GetStringAddress());
-                const TeamUplink uplink = TeamUplinkOf(port.GetTeamUplink());
-                record->SetField("Team Uplink", uplink.name);
-                record->SetField("Uplink Port ID", uplink.uplinkPortId);
-                record->SetField("Active Filters", ActiveFilterNames(port.GetFilterStats()));
-                records->Append(std::move(record));
-            });
+            ForEachWorldPort(
+                switchInfo, [&](const std::string& switchName, SwitchKind kind, const HostCtl::Network::Port& port) {
+                    if (worldId <= 0 || port.GetWorldId() != static_cast<std::uint64_t>(worldId)) return;
+                    boost::shared_ptr<MetaObj::MetaStruct> record = GetOutputStructure();
+                    record->SetField("Port ID", port.GetPortId());
+                    record->SetField("vSwitch", switchName);
+                    record->SetField("Portgroup", PortNetworkName(kind, port));
+                    record->SetField("DVPort ID", kind == SwitchKind::Distributed ? port.GetDVPortId() : std::string());
+                    record->SetField("MAC Address", port.GetMacAddress().GetStringAddress());
+                    record->SetField("IP Address", port.GetIpAddress().GetStringAddress());
+                    const TeamUplink uplink = TeamUplinkOf(port.GetTeamUplink());
+                    record->SetField("Team Uplink", uplink.name);
+                    record->SetField("Uplink Port ID", uplink.uplinkPortId);
+                    record->SetField("Active Filters", ActiveFilterNames(port.GetFilterStats()));
+                    records->Append(std::move(record));
+                });
             if (records->Size() == 0) {
                 output->SetError("Couldn't find VM with given world ID");
                 return;

@@ -22,8 +22,7 @@ std::optional<DVSwitchList> SelectLacpSwitches(const CallSpec::Input& input, Cal
     }
     switches = PldCtl::Network::VirtualSwitchInfoImpl().GetDVSwitches();
     if (switches.empty()) {
-        output.SetError(
-            "LACP is supported on Orvix DVSwitch only, and there is no DVSwitch configured on host.");
+        output.SetError("LACP is supported on Orvix DVSwitch only, and there is no DVSwitch configured on host.");
         return std::nullopt;
     }
     return switches;

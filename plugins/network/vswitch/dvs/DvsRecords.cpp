@@ -138,8 +138,7 @@ boost::shared_ptr<MetaObj::MetaStruct> LacpConfigTemplate() {
 }
 
 const std::string& LacpConfigFieldList() {
-    static const std::string fields =
-        Joined({kDvsName, kLagName, kLagId, kNics, kEnabled, kMode, kLoadBalance});
+    static const std::string fields = Joined({kDvsName, kLagName, kLagId, kNics, kEnabled, kMode, kLoadBalance});
     return fields;
 }
 
@@ -178,11 +177,10 @@ void DescribeLacpStatus(AutoCli::Command& command) {
     command.SetDefaultOutputParameter("table-columns:LAG", Joined({kDvSwitch, kLagId, kMode, kAge, kFlags, kNicList}));
     command.SetDefaultOutputParameter("table-columns:NicStatus",
                                       Joined({kNic, kState, kLocalInformation, kPartnerInformation}));
-    command.SetDefaultOutputParameter(
-        "table-columns:LocalInfo", Joined({kFlags, kAdminKey, kOperKey, kPortPriority, kPortNumber, kPortState}));
-    command.SetDefaultOutputParameter(
-        "table-columns:PartnerInfo",
-        Joined({kDeviceId, kAge, kFlags, kOperKey, kPortPriority, kPortNumber, kPortState}));
+    command.SetDefaultOutputParameter("table-columns:LocalInfo",
+                                      Joined({kFlags, kAdminKey, kOperKey, kPortPriority, kPortNumber, kPortState}));
+    command.SetDefaultOutputParameter("table-columns:PartnerInfo", Joined({kDeviceId, kAge, kFlags, kOperKey,
+                                                                           kPortPriority, kPortNumber, kPortState}));
 }
 
 boost::shared_ptr<MetaObj::MetaStruct> LagStatusRecord(const std::string& dvsName,

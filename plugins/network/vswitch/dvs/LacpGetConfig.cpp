@@ -70,7 +70,9 @@ void LacpGetConfig::ExecuteInternal(boost::shared_ptr<CallSpec::Input> input,
             const std::string dvsName = dvs->GetName();
             BuildThenRelease(
                 dvs->GetLacpConfig(),
-                [&](std::unique_ptr<HostCtl::Network::LacpConfig> config) { dvs->ReleaseLacpConfig(std::move(config)); },
+                [&](std::unique_ptr<HostCtl::Network::LacpConfig> config) {
+                    dvs->ReleaseLacpConfig(std::move(config));
+                },
                 [&](const HostCtl::Network::LacpConfig& config) {
                     if (config.lags.empty()) {
                         // LACP set per uplink port group rather than by LAGs.
