@@ -1,15 +1,16 @@
 ## LAGs in the table the command shows by default: modes active, passive and
-## none; load balancing "None" (0), "Src portID" (20) and a value the table
-## has no word for (25), shown as its number; a LAG without members has no
-## NICs. A switch without LAGs shows its LACP uplink port groups instead, by
+## none; load balancing "None" (0), "Src portID" (20), "Src and dst port"
+## (13) and "Vlan" (7); a LAG without members has no NICs. (The host refuses
+## a value the table has no word for, which would show as its number.) A
+## switch without LAGs shows its LACP uplink port groups instead, by
 ## ascending port group id, the first port of each group deciding the mode.
 @profile fixtures/dvs/lacp.json
 $ orvixcli network vswitch dvs orvix lacp config get
 DVS Name     LAG Name               LAG ID  NICs           Enabled  Mode     Load balance
------------  ---------------------  ------  -------------  -------  -------  ------------
+-----------  ---------------------  ------  -------------  -------  -------  ----------------
 dvsLag       lag-fast               1       hwnic0,hwnic1  true     Active   None
 dvsLag       lag-slow               7       hwnic2         true     Passive  Src portID
-dvsLag       lag-spare              9                      true     None     25
+dvsLag       lag-spare              9                      true     None     Src and dst port
 dvsUplinkPg  default_uplink_pg_lag  0                      true     None     ---
 dvsUplinkPg  default_uplink_pg_lag  0                      true     Passive  ---
 dvsEmptyLag  lag-unused             3                      true     Active   Vlan
@@ -40,7 +41,7 @@ $ orvixcli network vswitch dvs orvix lacp config get --formatter=json
     "NICs": "",
     "Enabled": true,
     "Mode": "None",
-    "Load balance": "25"
+    "Load balance": "Src and dst port"
   },
   {
     "DVS Name": "dvsUplinkPg",
