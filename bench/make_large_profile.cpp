@@ -30,6 +30,8 @@ constexpr long long kPortBlock = 1LL << 24;
 constexpr int kRulesets = 200;
 constexpr int kRulesPerRuleset = 25;       // 5000 rules
 constexpr int kAllowedIpsPerRuleset = 10;  // 2000 allowed addresses
+// The VM world of switch s has the id kVmWorldBase + s.
+constexpr long long kVmWorldBase = 3000000;
 
 std::string Mac(int a, int b) {
     char text[18];
@@ -363,6 +365,16 @@ int main() {
                                {"foreignPort", 0}});
         }
         connections.push_back(connection);
+    }
+
+    // Virtual machines: the VM ports of each switch are used by one VM world
+    // of that switch, so the VM commands group ports on every switch.
+    for (Json& port : ports) {
+        if (port.value("type", "") != "vm") continue;
+        port["worldId"] = kVmWorldBase + port["id"].get<long long>() / kPortBlock - 2;
+    }
+    for (int s = 0; s < kSwitches; ++s) {
+        worlds.push_back({{"id", kVmWorldBase + s}, {"name", "orvm:vm" + std::to_string(s)}, {"kind", "vm"}});
     }
 
     profile["nics"] = nics;

@@ -111,3 +111,27 @@ echo "Large host: 1000 switches, 4096 ports, 2000 port groups, 64 NICs, 256 inte
     "network firewall ruleset rule list" "$cli network firewall ruleset rule list" \
     "... ruleset allowedip add" "$cli network firewall ruleset allowedip add -r ruleset199 -i 203.0.113.250" \
     "... ruleset allowedip remove" "$cli network firewall ruleset allowedip remove -r ruleset199 -i 203.0.113.250"
+
+# Ports, VMs and distributed switches: the single-port command looks its port
+# up directly, so it should cost the same on both hosts; the listings walk
+# every port once. The large host's ports of the first 254 switches have ids
+# within 32 bits; 200 * 2^24 + 33554433 is the first port of vSwitch200, a VM
+# port of world 3000200.
+export ORVIX_HOST_DB=$work/default.db
+echo
+echo "Ports, VMs and distributed switches, default host ($runs runs each):"
+"$bin/orvix-bench-timer" "$runs" \
+    "baseline (dlopen + one call)" "$bin/orvix-bench-baseline" \
+    "network vm list" "$cli network vm list" \
+    "network vm port list" "$cli network vm port list -w 1049601" \
+    "network port stats get" "$cli network port stats get -p 67108870" \
+    "network vswitch dvs orvix list" "$cli network vswitch dvs orvix list"
+export ORVIX_HOST_DB=$work/large.db
+echo
+echo "Ports, VMs and distributed switches, large host ($runs runs each):"
+"$bin/orvix-bench-timer" "$runs" \
+    "baseline (dlopen + one call)" "$bin/orvix-bench-baseline" \
+    "network vm list" "$cli network vm list" \
+    "network vm port list" "$cli network vm port list -w 3000200" \
+    "network port stats get" "$cli network port stats get -p $((200 * 16777216 + 33554433))" \
+    "network vswitch dvs orvix list" "$cli network vswitch dvs orvix list"

@@ -29,6 +29,8 @@ namespace {
 constexpr std::int64_t kInt32Max = std::numeric_limits<std::int32_t>::max();
 constexpr std::uint64_t kInt64Max = std::numeric_limits<std::int64_t>::max();
 constexpr std::uint64_t kUint64Max = std::numeric_limits<std::uint64_t>::max();
+constexpr std::uint64_t kUint32Max = std::numeric_limits<std::uint32_t>::max();
+constexpr std::uint64_t kUint16Max = std::numeric_limits<std::uint16_t>::max();
 
 struct FieldCheck;
 using FieldChecks = std::vector<FieldCheck>;
@@ -163,14 +165,63 @@ const FieldChecks kPortGroup = {
     Nested("security", kSecurity),
     Nested("shaping", kShaping),
 };
+// LACP: the keys, priorities and port numbers of a session are 16-bit, its
+// state bytes 8-bit; the load-balancing index points into a table of 21.
+const FieldChecks kLacpLocal = {Integer("adminKey", 0, kUint16Max), Integer("operKey", 0, kUint16Max),
+                                Integer("portPriority", 0, kUint16Max), Integer("portNumber", 0, kUint16Max),
+                                Integer("state", 0, 255)};
+const FieldChecks kLacpPartner = {Text("deviceId"),
+                                  Text("flags"),
+                                  Integer("age", 0, kUint64Max),
+                                  Integer("operKey", 0, kUint16Max),
+                                  Integer("portPriority", 0, kUint16Max),
+                                  Integer("portNumber", 0, kUint16Max),
+                                  Integer("state", 0, 255)};
+const FieldChecks kLacpStats = {Integer("txLacpdus", 0, kUint64Max), Integer("rxLacpdus", 0, kUint64Max),
+                                Integer("txErrors", 0, kUint64Max), Integer("rxErrors", 0, kUint64Max)};
+const FieldChecks kLagMember = {Text("nic"),
+                                Text("state"),
+                                Flag("shortTimeout"),
+                                Nested("local", kLacpLocal),
+                                Nested("partner", kLacpPartner),
+                                Nested("stats", kLacpStats)};
+const FieldChecks kLag = {Integer("id", 0, kInt64Max), Text("name"), Word("mode", {"active", "passive", "none"}),
+                          Integer("loadBalance", 0, 20), NestedList("members", kLagMember)};
 const FieldChecks kDvSwitch = {
     Text("name"),
     Text("uuid"),
+    Text("class"),
     Integer("numPorts", kMinSwitchPorts, kMaxSwitchPorts),
+    Integer("mtu", 1280, 9000),
+    Word("cdp", {"down", "listen", "advertise", "both"}),
+    Integer("beaconTimeout", -1, kInt32Max),
+    Flag("orvixBranded"),
     Names("uplinks"),
+    NestedList("lags", kLag),
 };
 const FieldChecks kVlanStats = {Integer("vlanId", 0, 4095), Integer("rxPackets", 0, kUint64Max),
                                 Integer("txPackets", 0, kUint64Max)};
+const FieldChecks kPortStats = {
+    Integer("rxPackets", 0, kUint64Max),   Integer("txPackets", 0, kUint64Max),   Integer("rxBytes", 0, kUint64Max),
+    Integer("txBytes", 0, kUint64Max),     Integer("rxBroadcast", 0, kUint64Max), Integer("txBroadcast", 0, kUint64Max),
+    Integer("rxMulticast", 0, kUint64Max), Integer("txMulticast", 0, kUint64Max), Integer("rxDropped", 0, kUint64Max),
+    Integer("txDropped", 0, kUint64Max),
+};
+const FieldChecks kFilter = {
+    Text("name"),
+    Text("key"),
+    Flag("present"),
+    Word("direction", {"receive", "transmit"}),
+    Flag("extended"),
+    Integer("packetsIn", 0, kUint64Max),
+    Integer("packetsOut", 0, kUint64Max),
+    Integer("packetsDropped", 0, kUint64Max),
+    Integer("packetsFiltered", 0, kUint64Max),
+    Integer("packetsFaulted", 0, kUint64Max),
+    Integer("packetsQueued", 0, kUint64Max),
+    Integer("packetsInjected", 0, kUint64Max),
+    Integer("packetErrors", 0, kUint64Max),
+};
 const FieldChecks kPort = {
     // Port ids pass 32 bits on a host of many switches, whose id blocks
     // start at (n + 2) * 2^24.
@@ -180,12 +231,17 @@ const FieldChecks kPort = {
     Text("client"),
     Text("portgroup"),
     Text("dvPortId"),
+    Integer("worldId", 0, kUint32Max),
+    Text("mac"),
+    Address("ip", 4),
+    Text("teamUplink"),
+    Nested("stats", kPortStats),
+    NestedList("filters", kFilter),
     Flag("vlanStatsEnabled"),
     NestedList("vlanStats", kVlanStats),
 };
 // Physical NICs and their driver data. Codes that no word names (ports,
 // wake-on-LAN modes) are allowed, as a driver may report them.
-constexpr std::uint64_t kUint32Max = std::numeric_limits<std::uint32_t>::max();
 const FieldChecks kLinkMode = {Integer("speed", 0, kUint32Max), Word("duplex", {"auto", "full", "half"})};
 const FieldChecks kPause = {Flag("supported"), Flag("autoNegotiate"),         Flag("rx"),
                             Flag("tx"),        Integer("rxResolution", 0, 1), Integer("txResolution", 0, 1)};
@@ -316,7 +372,9 @@ const FieldChecks kFirewallRuleset = {
     AddressesOrNetworks("allowedIps"),
     NestedList("rules", kFirewallRule),
 };
-const FieldChecks kDvPort = {Text("dvswitch"), Text("id"), Integer("connectionId", 0, kUint32Max)};
+const FieldChecks kDvPort = {Text("dvswitch"),    Text("id"),
+                             Text("portgroupId"), Integer("connectionId", 0, kUint32Max),
+                             Flag("lacpEnabled"), Word("lacpMode", {"active", "passive", "none"})};
 const FieldChecks kNetstack = {
     Text("key"),
     Text("name"),

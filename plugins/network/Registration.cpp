@@ -95,6 +95,10 @@
 #include "nic/SriovNicList.h"
 #include "nic/VfList.h"
 #include "nic/VfStats.h"
+#include "port/PortFilterStatsGet.h"
+#include "port/PortStatsGet.h"
+#include "vm/VMList.h"
+#include "vm/VMPortList.h"
 #include "vswitch/VirtualSwitchPortGroupAdd.h"
 #include "vswitch/VirtualSwitchPortGroupList.h"
 #include "vswitch/VirtualSwitchPortGroupPolicyFailoverGet.h"
@@ -117,6 +121,11 @@
 #include "vswitch/VirtualSwitchStandardSet.h"
 #include "vswitch/VirtualSwitchStandardUplinkAdd.h"
 #include "vswitch/VirtualSwitchStandardUplinkRemove.h"
+#include "vswitch/dvs/LacpGetConfig.h"
+#include "vswitch/dvs/LacpGetStats.h"
+#include "vswitch/dvs/LacpGetStatus.h"
+#include "vswitch/dvs/LacpSetTimeout.h"
+#include "vswitch/dvs/VirtualSwitchDVSOrvixList.h"
 
 namespace {
 
@@ -430,7 +439,7 @@ extern "C" __attribute__((visibility("default"))) void AutoCli_RegisterNamespace
         Attach(vswitchDvs, "orvix", "Commands to retrieve Orvix Brenvo Distributed Switch information");
 
     // network vswitch dvs orvix
-    // list: VirtualSwitchDVSOrvixList
+    vswitchDvsOrvix->RegisterNamespaceNode(VirtualSwitchDVSOrvixList::New(), "list");
     // lacp: attached last of all, below
 
     // network firewall
@@ -461,20 +470,20 @@ extern "C" __attribute__((visibility("default"))) void AutoCli_RegisterNamespace
     auto portFilter = Attach(port, "filter", "Commands to get port filter information");
 
     // network port stats
-    // get: PortStatsGet
+    portStats->RegisterNamespaceNode(PortStatsGet::New(), "get");
 
     // network port filter
     auto portFilterStats = Attach(portFilter, "stats", "Commands to get port filter statistics");
 
     // network port filter stats
-    // get: PortFilterStatsGet
+    portFilterStats->RegisterNamespaceNode(PortFilterStatsGet::New(), "get");
 
     // network vm
-    // list: VMList
+    vm->RegisterNamespaceNode(VMList::New(), "list");
     auto vmPort = Attach(vm, "port", "Command to list ports of a given VM");
 
     // network vm port
-    // list: VMPortList
+    vmPort->RegisterNamespaceNode(VMPortList::New(), "list");
 
     // The LACP subtree comes after every other subtree, so "lacp" follows "list"
     // under network vswitch dvs orvix.
@@ -486,16 +495,16 @@ extern "C" __attribute__((visibility("default"))) void AutoCli_RegisterNamespace
     auto vswitchDvsOrvixLacpTimeout = Attach(vswitchDvsOrvixLacp, "timeout", "Command to set LACP LAG timeout");
 
     // network vswitch dvs orvix lacp config
-    // get: LacpGetConfig
+    vswitchDvsOrvixLacpConfig->RegisterNamespaceNode(LacpGetConfig::New(), "get");
 
     // network vswitch dvs orvix lacp status
-    // get: LacpGetStatus
+    vswitchDvsOrvixLacpStatus->RegisterNamespaceNode(LacpGetStatus::New(), "get");
 
     // network vswitch dvs orvix lacp stats
-    // get: LacpGetStats
+    vswitchDvsOrvixLacpStats->RegisterNamespaceNode(LacpGetStats::New(), "get");
 
     // network vswitch dvs orvix lacp timeout
-    // set: LacpSetTimeout
+    vswitchDvsOrvixLacpTimeout->RegisterNamespaceNode(LacpSetTimeout::New(), "set");
 
     parent->RegisterNamespaceNode(network, "network");
 }

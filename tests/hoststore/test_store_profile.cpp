@@ -253,3 +253,34 @@ TEST(ProfileTest, ProfileFiles) {
 }
 
 }  // namespace
+
+TEST(ProfileTest, LacpPortAndFilterFieldsAreCheckedToTheirDepth) {
+    auto lag = [](const std::string& fields) {
+        return ErrorOf(WithSections(R"("dvswitches": [{"name": "d", "uuid": "u", "lags": [{"id": 1, "name": "l", )" +
+                                    fields + "}]}]"));
+    };
+    EXPECT_EQ(lag(R"("loadBalance": 21)"),
+              "profile t.json: dvswitches[0].lags[0].loadBalance: must be an integer from 0 to 20, not 21");
+    EXPECT_EQ(lag(R"("members": [{"nic": "n", "local": {"portNumber": 65536}}])"),
+              "profile t.json: dvswitches[0].lags[0].members[0].local.portNumber: must be an integer from 0 to "
+              "65535, not 65536");
+    EXPECT_EQ(lag(R"("members": [{"nic": "n", "partner": {"state": 256}}])"),
+              "profile t.json: dvswitches[0].lags[0].members[0].partner.state: must be an integer from 0 to 255, "
+              "not 256");
+    EXPECT_NE(lag(R"("mode": "eager")"), "(accepted)");
+    EXPECT_NE(ErrorOf(WithSections(R"("dvports": [{"dvswitch": "d", "id": "1", "lacpMode": "fast"}])")), "(accepted)");
+    auto port = [](const std::string& fields) {
+        return ErrorOf(WithSections(R"("ports": [{"id": 1, "portset": "a", )" + fields + "}]"));
+    };
+    EXPECT_NE(port(R"("filters": [{"name": "f", "direction": "sideways"}])"), "(accepted)");
+    EXPECT_NE(port(R"("ip": "192.0.2.01")"), "(accepted)");
+    EXPECT_NE(port(R"("stats": {"rxPackets": -1})"), "(accepted)");
+    EXPECT_EQ(port(R"("worldId": 4294967296)"),
+              "profile t.json: ports[0].worldId: must be an integer from 0 to 4294967295, not 4294967296");
+    // The edges of each range.
+    EXPECT_EQ(lag(R"("loadBalance": 20, "mode": "none", "members": [{"nic": "n", "local": {"state": 255,
+                      "portNumber": 65535}, "partner": {"age": 18446744073709551615}}])"),
+              "(accepted)");
+    EXPECT_EQ(port(R"("ip": "0.0.0.0", "worldId": 4294967295, "filters": [{"name": "f", "direction": "transmit"}])"),
+              "(accepted)");
+}

@@ -4,7 +4,8 @@
 #include "hostctl/network/NetworkInfoImpl.h"
 #include "hostctl/network/ip/PldNic.h"
 #include "hostctl/network/vswitch/SwitchImpl.h"
-#include "network/dvs/DVSwitchImpl.h"
+#include "hostctl/network/dvs/DVSwitchImpl.h"
+#include "network/dvs/DvsRecords.h"
 #include "network/vswitch/VswitchRecords.h"
 
 namespace HostCtl {
@@ -38,10 +39,12 @@ std::unique_ptr<NetworkInfo> NetworkFactory::GetNetworkInfo() {
 }
 
 std::unique_ptr<DVSwitch> NetworkFactory::GetDVSwitchByName(const std::string& name) {
-    std::unique_ptr<DVSwitch> dvswitch = PldCtl::Network::DVSwitchImpl::Find(
-        PldCtl::Detail::EnterOperation("NetworkFactory::GetDVSwitchByName", name), name);
-    if (!dvswitch) throw Lib::HostCtlException("no such distributed switch");
-    return dvswitch;
+    using PldCtl::Detail::DvSwitchRecord;
+    PldCtl::Store::HostStore& store = PldCtl::Detail::EnterOperation("NetworkFactory::GetDVSwitchByName", name);
+    std::optional<DvSwitchRecord> dvswitch = PldCtl::Detail::Get<DvSwitchRecord>(store, name);
+    if (!dvswitch) return nullptr;
+    return std::make_unique<PldCtl::Network::DVSwitchImpl>(
+        std::make_shared<const DvSwitchRecord>(std::move(*dvswitch)));
 }
 
 }  // namespace Network

@@ -4,35 +4,9 @@
 #include <string>
 
 #include "Operation.h"
-#include "hoststore/CollectionNames.h"
-#include "network/RecordCodec.h"
+#include "resource/WorldRecords.h"
 
 namespace PldCtl {
-namespace Detail {
-
-// One running world, keyed by its id; `kind` is "vm" or "host".
-struct WorldRecord {
-    static constexpr const char* kSection = Store::Section::kWorlds;
-
-    std::uint64_t id = 0;
-    std::string name;
-    std::string kind = "host";
-};
-
-// clang-format off
-template <>
-struct RecordFields<WorldRecord> {
-    static constexpr auto All() {
-        return std::make_tuple(
-            Field("id", &WorldRecord::id),
-            Field("name", &WorldRecord::name),
-            Field("kind", &WorldRecord::kind));
-    }
-};
-// clang-format on
-
-}  // namespace Detail
-
 namespace Resource {
 
 ResourceInfoImpl::ResourceInfoImpl() = default;
@@ -51,5 +25,3 @@ std::string ResourceInfoImpl::GetWorldName(unsigned long long id) {
 
 }  // namespace Resource
 }  // namespace PldCtl
-
-STORED_RECORD(PldCtl::Detail::WorldRecord);

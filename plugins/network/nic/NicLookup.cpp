@@ -48,6 +48,7 @@ std::optional<std::vector<std::unique_ptr<HostCtl::Network::Pnic>>> SelectPnics(
 HostCtl::Network::Portset* FindUplinkSwitch(const std::vector<std::unique_ptr<HostCtl::Network::Portset>>& switches,
                                             const std::string& nic, CallSpec::Output& output) {
     for (const auto& vswitch : switches) {
+        if (!dynamic_cast<const HostCtl::Network::VirtualSwitch*>(vswitch.get())) continue;
         for (const std::string& uplink : vswitch->GetUplinks()) {
             if (uplink == nic) return vswitch.get();
         }

@@ -1,6 +1,5 @@
 #include "vswitch/VirtualSwitchStandardList.h"
 
-#include <algorithm>
 #include <memory>
 #include <set>
 #include <string>
@@ -10,6 +9,7 @@
 #include "common/CommandSupport.h"
 #include "hostctl/network/NetworkInfoImpl.h"
 #include "hostctl/network/vswitch/SwitchImpl.h"
+#include "vswitch/VswitchRecords.h"
 
 namespace OrvixCli {
 namespace NetworkNamespace {
@@ -17,12 +17,6 @@ namespace NetworkNamespace {
 namespace {
 
 using SwitchList = std::vector<std::unique_ptr<HostCtl::Network::VirtualSwitch>>;
-
-std::set<std::string> PnicNames(PldCtl::Network::NetworkInfoImpl& networkInfo) {
-    std::set<std::string> names;
-    for (const auto& pnic : networkInfo.GetPnics()) names.insert(pnic->GetName());
-    return names;
-}
 
 // Fills a VirtualSwitch record, field by field in the order of the output.
 void FillSwitchRecord(MetaObj::MetaStruct& record, const HostCtl::Network::VirtualSwitch& vswitch,
@@ -38,12 +32,8 @@ void FillSwitchRecord(MetaObj::MetaStruct& record, const HostCtl::Network::Virtu
     record.SetField("Beacon Interval", vswitch.GetBeaconInterval());
     record.SetField("Beacon Threshold", vswitch.GetBeaconThreshold());
     record.SetField("Beacon Required By", vswitch.GetBeaconRequiredBy());
-    // A switch may still name a NIC the host no longer has; only NICs that
-    // exist are shown, in the switch's order.
     std::vector<std::string> uplinks = vswitch.GetUplinks();
-    uplinks.erase(std::remove_if(uplinks.begin(), uplinks.end(),
-                                 [&](const std::string& uplink) { return pnics.count(uplink) == 0; }),
-                  uplinks.end());
+    KeepHostNics(uplinks, pnics);
     record.SetField("Uplinks", std::move(uplinks));
     const auto portGroups = vswitch.GetPortGroups();
     std::vector<std::string> portGroupNames;
@@ -95,7 +85,7 @@ void VirtualSwitchStandardList::ExecuteInternal(boost::shared_ptr<CallSpec::Inpu
             // like any switch that cannot be read.
             switches.push_back(switchInfo.GetVirtualSwitchByName(name));
         }
-        const std::set<std::string> pnics = PnicNames(networkInfo);
+        const std::set<std::string> pnics = HostNicNames(networkInfo);
 
         boost::shared_ptr<MetaObj::MetaList> records =
             MetaObj::MetaList::New(MetaObj::META_STRUCT, GetOutputStructure());

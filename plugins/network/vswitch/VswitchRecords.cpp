@@ -157,5 +157,17 @@ void FillOverrideFields(MetaObj::MetaStruct& record, const ShapingPolicy& own) {
     record.SetField(Override(kBurstSize), own.IsBurstSizeSet());
 }
 
+std::set<std::string> HostNicNames(PldCtl::Network::NetworkInfoImpl& networkInfo) {
+    std::set<std::string> names;
+    for (const auto& pnic : networkInfo.GetPnics()) names.insert(pnic->GetName());
+    return names;
+}
+
+void KeepHostNics(std::vector<std::string>& uplinks, const std::set<std::string>& hostNics) {
+    uplinks.erase(std::remove_if(uplinks.begin(), uplinks.end(),
+                                 [&](const std::string& uplink) { return hostNics.count(uplink) == 0; }),
+                  uplinks.end());
+}
+
 }  // namespace NetworkNamespace
 }  // namespace OrvixCli

@@ -4,11 +4,13 @@
 // followed by one "Override Vswitch" field per setting it may override.
 #pragma once
 
+#include <set>
 #include <string>
 #include <vector>
 
 #include "framework/AutoCli.h"
 #include "framework/MetaObj.h"
+#include "hostctl/network/NetworkInfoImpl.h"
 #include "hostctl/network/vswitch/Policy.h"
 
 namespace OrvixCli {
@@ -34,6 +36,12 @@ void FillPolicyFields(MetaObj::MetaStruct& record, const HostCtl::Network::Shapi
 void FillOverrideFields(MetaObj::MetaStruct& record, const HostCtl::Network::NicTeamingPolicy& own);
 void FillOverrideFields(MetaObj::MetaStruct& record, const HostCtl::Network::PortSecurityPolicy& own);
 void FillOverrideFields(MetaObj::MetaStruct& record, const HostCtl::Network::ShapingPolicy& own);
+
+// The names of the host's physical NICs, read once for a listing.
+std::set<std::string> HostNicNames(PldCtl::Network::NetworkInfoImpl& networkInfo);
+// A switch, standard or distributed, may still name a NIC the host no longer
+// has: drops those names from `uplinks`, keeping the others in their order.
+void KeepHostNics(std::vector<std::string>& uplinks, const std::set<std::string>& hostNics);
 
 }  // namespace NetworkNamespace
 }  // namespace OrvixCli

@@ -208,7 +208,8 @@ TEST_F(Diagnostics, VirtualFunctionsAreFoundByTheirWholeId) {
 TEST_F(Diagnostics, UplinkVlanCounters) {
     PldCtl::Network::VirtualSwitchInfoImpl switches;
     auto all = switches.GetAllSwitches();
-    ASSERT_EQ(all.size(), 2u);
+    ASSERT_EQ(all.size(), 3u);  // vSwitch0, vSwitch1, then the distributed dvSwitch0
+    EXPECT_EQ(all[2]->GetName(), "dvSwitch0");
     auto& vSwitch0 = *all[0];
     EXPECT_EQ(vSwitch0.GetName(), "vSwitch0");
     auto counted = vSwitch0.GetUplinkVlanStats("hwnic0");

@@ -6,6 +6,7 @@
 #include <string>
 
 #include "hostctl/Export.h"
+#include "hostctl/network/ConnectionPoint.h"
 #include "hostctl/network/NetworkInfo.h"
 #include "hostctl/network/dvs/DVSwitch.h"
 #include "hostctl/network/vswitch/VirtualSwitch.h"
@@ -23,9 +24,12 @@ public:
     // The host's network-info object (its NICs). Never throws: the host is
     // reached by the object's operations.
     static std::unique_ptr<NetworkInfo> GetNetworkInfo();
-    // The distributed switch of that name; throws HostCtlException ("no such
-    // distributed switch") when the host has none.
+    // The distributed switch of that name, or null.
     static std::unique_ptr<DVSwitch> GetDVSwitchByName(const std::string& name);
+    // The DV port `param.portId` of the distributed switch of UUID
+    // `param.switchUuid`, or null (fault name "NetworkFactory::GetDVPort",
+    // keyed by the port id).
+    static std::unique_ptr<DVPort> GetDVPort(const DVPortParam& param);
 };
 
 }  // namespace Network

@@ -1,12 +1,11 @@
-// A DV port as a connection point. Its switch is named by UUID, so each
-// question that needs the switch finds it among the host's distributed
-// switches (a host has few).
+// A DV port as a connection point and as a port of its switch. Its switch
+// is named by UUID, so each question that needs the switch finds it among
+// the host's distributed switches (a host has few).
 #include "hostctl/network/dvs/DVPortImpl.h"
 
-#include <optional>
-
 #include "Operation.h"
-#include "network/dvs/DvsRecords.h"
+#include "hostctl/network/NetworkFactory.h"
+#include "network/dvs/DvsLookup.h"
 
 HostCtl::Network::ConnectionPoint::~ConnectionPoint() = default;
 
@@ -15,32 +14,28 @@ namespace Network {
 
 namespace {
 
-// The switch of the port's UUID and the port on it, from one read; nullopt
-// when the host has either not.
-std::optional<std::pair<Detail::DvSwitchRecord, Detail::DvPortRecord>> FindPort(
-    const HostCtl::Network::DVPortParam& param) {
-    if (param.switchUuid.empty() || !Detail::FitsJoinedKey(param.portId)) return std::nullopt;
-    std::optional<std::pair<Detail::DvSwitchRecord, Detail::DvPortRecord>> found;
-    Store::HostStore::Default().Read([&](Store::Transaction& t) {
-        for (Detail::DvSwitchRecord& dvswitch : Detail::List<Detail::DvSwitchRecord>(t)) {
-            if (dvswitch.uuid != param.switchUuid) continue;
-            auto port = Detail::Get<Detail::DvPortRecord>(t, Detail::DvPortKey(dvswitch.name, param.portId));
-            if (port) found.emplace(std::move(dvswitch), std::move(*port));
-            return;
-        }
-    });
+// The DV port a parameter names, from one read; nullopt when the host has
+// no such port.
+std::optional<Detail::DvPortFound> ReadPort(const HostCtl::Network::DVPortParam& param) {
+    std::optional<Detail::DvPortFound> found;
+    Store::HostStore::Default().Read([&](Store::Transaction& t) { found = Detail::FindDvPort(t, param); });
     return found;
 }
 
 }  // namespace
 
 DVPortImpl::DVPortImpl(const HostCtl::Network::DVPortParam& param) : param_(param) {}
+
+DVPortImpl::DVPortImpl(const HostCtl::Network::DVPortParam& param, std::shared_ptr<const Detail::DvPortRecord> record,
+                       std::vector<std::string> clients)
+    : param_(param), snapshot_(Snapshot{std::move(record), std::move(clients)}) {}
+
 DVPortImpl::~DVPortImpl() = default;
 
 std::uint32_t DVPortImpl::GetConnectionId() const {
     if (param_.connectionId != 0) return param_.connectionId;
-    auto port = FindPort(param_);
-    return port ? port->second.connectionId : 0;
+    auto port = ReadPort(param_);
+    return port ? port->port.record->connectionId : 0;
 }
 
 void DVPortImpl::SetConnectionId(std::uint32_t connectionId) {
@@ -52,8 +47,8 @@ int DVPortImpl::GetType() const {
 }
 
 std::string DVPortImpl::GetPortsetName() const {
-    auto port = FindPort(param_);
-    return port ? port->first.name : std::string();
+    auto port = ReadPort(param_);
+    return port ? port->dvswitch : std::string();
 }
 
 std::string DVPortImpl::GetPortGroupName() const {
@@ -72,11 +67,61 @@ HostCtl::Network::OpaqueNetworkParam DVPortImpl::GetOpaqueNetworkParam() const {
 
 bool DVPortImpl::IsValid() const {
     try {
-        return FindPort(param_).has_value();
+        return ReadPort(param_).has_value();
     } catch (const std::exception&) {
         return false;
     }
 }
 
+const DVPortImpl::Snapshot& DVPortImpl::Stored() const {
+    if (!snapshot_) {
+        std::optional<Detail::DvPortFound> found = ReadPort(param_);
+        if (!found) {
+            throw HostCtl::Lib::HostCtlException("DV port " + param_.portId +
+                                                 " does not exist on the DVSwitch with ID " + param_.switchUuid);
+        }
+        snapshot_ = Snapshot{std::move(found->port.record), std::move(found->port.clients)};
+    }
+    return *snapshot_;
+}
+
+std::string DVPortImpl::GetPortId() const {
+    return param_.portId;
+}
+
+std::string DVPortImpl::GetDVPortgroupId() const {
+    return Stored().record->portgroupId;
+}
+
+bool DVPortImpl::IsInUse(std::vector<std::string>& clients) const {
+    clients = Stored().clients;
+    return !clients.empty();
+}
+
+bool DVPortImpl::IsLacpEnabled() const {
+    return Stored().record->lacpEnabled;
+}
+
+int DVPortImpl::GetLacpMode() const {
+    return Detail::LacpModeNumber(Stored().record->lacpMode);
+}
+
 }  // namespace Network
 }  // namespace PldCtl
+
+namespace HostCtl {
+namespace Network {
+
+std::unique_ptr<DVPort> NetworkFactory::GetDVPort(const DVPortParam& param) {
+    PldCtl::Store::HostStore& store = PldCtl::Detail::EnterOperation("NetworkFactory::GetDVPort", param.portId);
+    std::optional<PldCtl::Detail::DvPortFound> found;
+    store.Read([&](PldCtl::Store::Transaction& t) { found = PldCtl::Detail::FindDvPort(t, param); });
+    if (!found) return nullptr;
+    DVPortParam stored = param;
+    stored.connectionId = found->port.record->connectionId;
+    return std::make_unique<PldCtl::Network::DVPortImpl>(stored, std::move(found->port.record),
+                                                         std::move(found->port.clients));
+}
+
+}  // namespace Network
+}  // namespace HostCtl

@@ -3,9 +3,11 @@
 #include <limits>
 
 #include "hostctl/Lib.h"
+#include "hostctl/network/dvs/DVSwitchImpl.h"
 #include "hostctl/network/vswitch/SwitchImpl.h"
 #include "hostctl/network/vswitch/VswitchTables.h"
 #include "network/NetworkRecords.h"
+#include "network/dvs/DvsLookup.h"
 #include "network/dvs/DvsRecords.h"
 #include "network/vswitch/VswitchLookup.h"
 
@@ -31,41 +33,90 @@ VirtualSwitchInfoImpl::~VirtualSwitchInfoImpl() = default;
 
 namespace {
 
+using PortCounts = std::unordered_map<std::string, Transaction::GroupCount>;
+
+// The configured and used ports of every switch, counted in one pass.
+PortCounts CountPorts(Transaction& t) {
+    return t.CountGroups(PortRecord::kSection, std::string(), {FieldTest{PortRecord::kClientField, std::nullopt}});
+}
+
+std::pair<int, int> CountsOf(const PortCounts& ports, const std::string& name) {
+    auto counted = ports.find(name);
+    if (counted == ports.end()) return {0, 0};
+    return {static_cast<int>(counted->second.all), static_cast<int>(counted->second.passing)};
+}
+
 // Every standard switch of the host, in its order, each with its port
-// counts and port groups.
+// counts and port groups. One pass over each collection for all switches,
+// instead of a few queries per switch: listing a thousand switches stays
+// quick.
 template <typename Switch>
-std::vector<std::unique_ptr<Switch>> ListSwitches(Store::HostStore& store) {
-    // One pass over each collection for all switches, instead of a few
-    // queries per switch: listing a thousand switches stays quick.
-    std::vector<std::unique_ptr<Switch>> switches;
-    store.Read([&](Transaction& t) {
-        const auto ports =
-            t.CountGroups(PortRecord::kSection, std::string(), {FieldTest{PortRecord::kClientField, std::nullopt}});
-        Detail::PortGroupsBySwitch portGroups = Detail::ListPortGroupsBySwitch(t);
-        for (auto& vswitch : Detail::DecodeShared<VswitchRecord>(t.ListText(VswitchRecord::kSection))) {
-            auto counted = ports.find(vswitch->name);
-            const std::pair<int, int> portCounts =
-                counted == ports.end()
-                    ? std::make_pair(0, 0)
-                    : std::make_pair(static_cast<int>(counted->second.all), static_cast<int>(counted->second.passing));
-            auto own = portGroups.find(vswitch->name);
-            std::vector<std::shared_ptr<const PortGroupRecord>> ownPortGroups;
-            if (own != portGroups.end()) ownPortGroups = std::move(own->second);
-            switches.push_back(
-                std::make_unique<VirtualSwitchImpl>(std::move(vswitch), portCounts, std::move(ownPortGroups)));
-        }
-    });
-    return switches;
+void ListStandardSwitches(Transaction& t, const PortCounts& ports, std::vector<std::unique_ptr<Switch>>& switches) {
+    Detail::PortGroupsBySwitch portGroups = Detail::ListPortGroupsBySwitch(t);
+    for (auto& vswitch : Detail::DecodeShared<VswitchRecord>(t.ListText(VswitchRecord::kSection))) {
+        const std::pair<int, int> portCounts = CountsOf(ports, vswitch->name);
+        auto own = portGroups.find(vswitch->name);
+        std::vector<std::shared_ptr<const PortGroupRecord>> ownPortGroups;
+        if (own != portGroups.end()) ownPortGroups = std::move(own->second);
+        switches.push_back(
+            std::make_unique<VirtualSwitchImpl>(std::move(vswitch), portCounts, std::move(ownPortGroups)));
+    }
+}
+
+// Every distributed switch of the host, in its order, with its port counts;
+// their DV ports are read once for all of them, when first asked for.
+template <typename Switch>
+void ListDistributedSwitches(Transaction& t, const PortCounts& ports, std::vector<std::unique_ptr<Switch>>& switches) {
+    std::vector<std::shared_ptr<const Detail::DvSwitchRecord>> records =
+        Detail::DecodeShared<Detail::DvSwitchRecord>(t.ListText(Detail::DvSwitchRecord::kSection));
+    std::vector<std::string> names;
+    for (const auto& record : records) names.push_back(record->name);
+    auto listing = std::make_shared<Detail::DvPortListing>(std::move(names));
+    for (auto& record : records) {
+        const std::pair<int, int> portCounts = CountsOf(ports, record->name);
+        switches.push_back(std::make_unique<DVSwitchImpl>(std::move(record), portCounts, listing));
+    }
 }
 
 }  // namespace
 
 std::vector<std::unique_ptr<VirtualSwitch>> VirtualSwitchInfoImpl::GetVirtualSwitches() {
-    return ListSwitches<VirtualSwitch>(Detail::EnterOperation("VirtualSwitchInfoImpl::GetVirtualSwitches"));
+    Store::HostStore& store = Detail::EnterOperation("VirtualSwitchInfoImpl::GetVirtualSwitches");
+    std::vector<std::unique_ptr<VirtualSwitch>> switches;
+    store.Read([&](Transaction& t) {
+        switches.clear();
+        ListStandardSwitches(t, CountPorts(t), switches);
+    });
+    for (const auto& vswitch : switches) listedKinds_[vswitch->GetName()] = SwitchKind::Standard;
+    return switches;
+}
+
+std::vector<std::unique_ptr<HostCtl::Network::DVSwitch>> VirtualSwitchInfoImpl::GetDVSwitches() {
+    Store::HostStore& store = Detail::EnterOperation("VirtualSwitchInfoImpl::GetDVSwitches");
+    std::vector<std::unique_ptr<HostCtl::Network::DVSwitch>> switches;
+    store.Read([&](Transaction& t) {
+        switches.clear();
+        ListDistributedSwitches(t, CountPorts(t), switches);
+    });
+    for (const auto& dvswitch : switches) listedKinds_[dvswitch->GetName()] = SwitchKind::Distributed;
+    return switches;
 }
 
 std::vector<std::unique_ptr<HostCtl::Network::Portset>> VirtualSwitchInfoImpl::GetAllSwitches() {
-    return ListSwitches<HostCtl::Network::Portset>(Detail::EnterOperation("VirtualSwitchInfoImpl::GetAllSwitches"));
+    Store::HostStore& store = Detail::EnterOperation("VirtualSwitchInfoImpl::GetAllSwitches");
+    std::vector<std::unique_ptr<HostCtl::Network::Portset>> switches;
+    std::size_t standard = 0;
+    store.Read([&](Transaction& t) {
+        switches.clear();
+        const PortCounts ports = CountPorts(t);
+        ListStandardSwitches(t, ports, switches);
+        standard = switches.size();
+        ListDistributedSwitches(t, ports, switches);
+    });
+    for (std::size_t i = 0; i < switches.size(); ++i) {
+        listedKinds_[switches[i]->GetName()] = i < standard ? SwitchKind::Standard : SwitchKind::Distributed;
+    }
+    return switches;
 }
 
 std::unique_ptr<VirtualSwitch> VirtualSwitchInfoImpl::GetVirtualSwitchByName(const std::string& name) {

@@ -98,30 +98,6 @@ struct RecordFields<PortGroupRecord> {
     }
 };
 
-template <>
-struct RecordFields<VlanStatsRecord> {
-    static constexpr auto All() {
-        return std::make_tuple(
-            Field("vlanId", &VlanStatsRecord::vlanId),
-            Field("rxPackets", &VlanStatsRecord::rxPackets),
-            Field("txPackets", &VlanStatsRecord::txPackets));
-    }
-};
-
-template <>
-struct RecordFields<PortRecord> {
-    static constexpr auto All() {
-        return std::make_tuple(
-            Field("id", &PortRecord::id),
-            Field("portset", &PortRecord::portset),
-            Field(PortRecord::kTypeField, &PortRecord::type),
-            Field(PortRecord::kClientField, &PortRecord::client),
-            Field(PortRecord::kPortGroupField, &PortRecord::portgroup),
-            Field("dvPortId", &PortRecord::dvPortId),
-            Field("vlanStatsEnabled", &PortRecord::vlanStatsEnabled),
-            Field("vlanStats", &PortRecord::vlanStats));
-    }
-};
 // clang-format on
 
 NicTeamingPolicy ToPolicy(const TeamingRecord& record) {
@@ -205,4 +181,3 @@ STORED_RECORD(PldCtl::Detail::SecurityRecord);
 STORED_RECORD(PldCtl::Detail::ShapingRecord);
 STORED_RECORD(PldCtl::Detail::VswitchRecord);
 STORED_RECORD(PldCtl::Detail::PortGroupRecord);
-STORED_RECORD(PldCtl::Detail::PortRecord);

@@ -1,6 +1,7 @@
 // The stored records of standard switching: switches, their port groups and
-// policies, and the ports of switches. Defaults are the member initialisers;
-// docs/host-profile.md describes the same fields for profile writers.
+// policies; the ports of switches are in network/port/PortRecords.h.
+// Defaults are the member initialisers; docs/host-profile.md describes the
+// same fields for profile writers.
 #pragma once
 
 #include <cstdint>
@@ -12,6 +13,7 @@
 #include "hostctl/network/vswitch/VirtualSwitch.h"
 #include "hoststore/CollectionNames.h"
 #include "network/StoredRecord.h"
+#include "network/port/PortRecords.h"
 
 namespace PldCtl {
 namespace Detail {
@@ -79,33 +81,6 @@ struct PortGroupRecord {
     TeamingRecord teaming;
     SecurityRecord security;
     ShapingRecord shaping;
-};
-
-// The packets of one VLAN seen on an uplink port.
-struct VlanStatsRecord {
-    std::int64_t vlanId = 0;
-    std::uint64_t rxPackets = 0;
-    std::uint64_t txPackets = 0;
-};
-
-// A port of a standard or distributed switch, as far as switches use it.
-struct PortRecord {
-    static constexpr const char* kSection = Store::Section::kPorts;
-    // Fields the store counts ports by without decoding them.
-    static constexpr const char* kClientField = "client";
-    static constexpr const char* kPortGroupField = "portgroup";
-    static constexpr const char* kTypeField = "type";
-    static constexpr const char* kUplinkType = "uplink";
-
-    std::int64_t id = 0;
-    std::string portset;
-    std::string type = "vm";
-    std::string client;  // "" for a free port
-    std::string portgroup;
-    std::string dvPortId;  // the DV port of a port on a distributed switch
-    // Uplink ports: per-VLAN counting, and its counters while it is on.
-    bool vlanStatsEnabled = false;
-    std::vector<VlanStatsRecord> vlanStats;
 };
 
 // A stored policy as the library's policy type, and back. Reading throws

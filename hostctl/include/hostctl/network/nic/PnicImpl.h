@@ -6,6 +6,7 @@
 
 #include "hostctl/Export.h"
 #include "hostctl/network/nic/Pnic.h"
+#include "hostctl/network/port/Port.h"
 
 namespace PldCtl {
 namespace Detail {
@@ -31,6 +32,10 @@ public:
     // The NIC's traffic counters; members the NIC does not count are left
     // as they are.
     void GetPnicStats(HostCtl::Network::PnicStats& stats);
+    // The NIC's uplink port on a standard or distributed switch; null when
+    // it is no uplink (fault name "PnicImpl::GetUplinkPort", keyed by the
+    // NIC's name).
+    std::unique_ptr<HostCtl::Network::Port> GetUplinkPort() const;
 
     std::string GetName() const override;
     std::unique_ptr<HostCtl::Network::PciDevice> GetPciDevice() const override;

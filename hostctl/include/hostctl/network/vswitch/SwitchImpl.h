@@ -5,11 +5,13 @@
 #include <memory>
 #include <optional>
 #include <string>
+#include <unordered_map>
 #include <vector>
 
 #include "hostctl/Export.h"
 #include "hostctl/network/ConnectionPoint.h"
 #include "hostctl/network/dvs/DVSwitch.h"
+#include "hostctl/network/port/Port.h"
 #include "hostctl/network/vswitch/VirtualSwitch.h"
 
 namespace PldCtl {
@@ -38,6 +40,11 @@ public:
     std::vector<std::unique_ptr<HostCtl::Network::VlanStats>> GetUplinkVlanStats(
         const std::string& uplink) const override;
     void SetUplinkVlanStatsEnabled(const std::string& uplink, bool enabled) override;
+    // Its ports, by ascending id, from one read (fault name
+    // "PortsetImpl::GetPorts", keyed by the switch's name).
+    std::vector<std::unique_ptr<HostCtl::Network::Port>> GetPorts() const override;
+    // The UUID of a distributed switch; "" for a standard switch.
+    virtual std::string GetSwitchUuid() const;
 
 protected:
     explicit PortsetImpl(std::shared_ptr<const Detail::VswitchRecord> record,
@@ -139,18 +146,33 @@ private:
     std::optional<int> activeClients_;
 };
 
-// The host's standard switches.
+// The host's standard and distributed switches.
 class HOSTCTL_EXPORT VirtualSwitchInfoImpl {
 public:
     VirtualSwitchInfoImpl();
     virtual ~VirtualSwitchInfoImpl();
 
-    // In the host's order.
+    // The standard switches, in the host's order.
     virtual std::vector<std::unique_ptr<HostCtl::Network::VirtualSwitch>> GetVirtualSwitches();
-    // The same switches as port sets.
+    // The distributed switches, in the host's order, from one read (their DV
+    // ports too are read once for all of them, when first asked for).
+    virtual std::vector<std::unique_ptr<HostCtl::Network::DVSwitch>> GetDVSwitches();
+    // Every switch as a port set: the standard switches, then the
+    // distributed ones, each in the host's order.
     virtual std::vector<std::unique_ptr<HostCtl::Network::Portset>> GetAllSwitches();
     // The distributed switch of that name, or null.
     virtual std::unique_ptr<HostCtl::Network::DVSwitch> GetDVSwitchByName(const std::string& name);
+    // What kind of switch has that name: a standard, a distributed or an
+    // opaque switch (this host has no opaque switches). A switch this
+    // object listed is answered from the listing, without a read.
+    virtual bool IsLegacySwitch(const std::string& name);
+    virtual bool IsDVSwitch(const std::string& name);
+    virtual bool IsOpaqueSwitch(const std::string& name);
+    // The port of that id, or null; a port whose switch the host does not
+    // have is not found, as by walking GetAllSwitches (fault name
+    // "VirtualSwitchInfoImpl::GetPortById", keyed by the decimal id). Its
+    // cost does not grow with the number of ports.
+    virtual std::unique_ptr<HostCtl::Network::Port> GetPortById(std::uint32_t id);
     // Null when there is none.
     virtual std::unique_ptr<HostCtl::Network::VirtualSwitch> GetVirtualSwitchByName(const std::string& name);
     // Throws for a name in use or not fit for a switch, a port count outside
@@ -163,6 +185,12 @@ public:
     // Throws for a switch the host does not have, or one whose ports are in
     // use by anything but its uplinks.
     virtual void RemoveVirtualSwitch(const std::string& name);
+
+private:
+    enum class SwitchKind { Standard, Distributed };
+    // The switches the last listing of this object saw, by name.
+    std::unordered_map<std::string, SwitchKind> listedKinds_;
+    std::optional<SwitchKind> KindOf(const std::string& name);
 };
 
 }  // namespace Network

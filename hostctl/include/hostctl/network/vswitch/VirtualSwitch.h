@@ -16,6 +16,7 @@
 
 #include "hostctl/Export.h"
 #include "hostctl/network/nic/Pnic.h"
+#include "hostctl/network/port/Port.h"
 #include "hostctl/network/vswitch/Policy.h"
 
 namespace HostCtl {
@@ -50,6 +51,8 @@ public:
     // Turns per-VLAN counting of one uplink on or off; turning it off drops
     // the counters. Throws for a name that is not an uplink of this switch.
     virtual void SetUplinkVlanStatsEnabled(const std::string& uplink, bool enabled) = 0;
+    // Its ports, by ascending id.
+    virtual std::vector<std::unique_ptr<Port>> GetPorts() const = 0;
 };
 
 // A standard virtual switch.
