@@ -2,9 +2,7 @@
 // to the host CLI's node.
 //
 // Each block below is one namespace with its children in their order of
-// attachment; a leaf whose command is not written yet is noted in its place
-// ("// word: Class"), so adding a command means replacing its note with the
-// RegisterNamespaceNode line. The root is attached to the host CLI's node
+// attachment. The root is attached to the host CLI's node
 // only at the very end: if anything throws before, the host CLI's node is
 // left untouched and no partial tree is ever visible.
 #include <boost/shared_ptr.hpp>
