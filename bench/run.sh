@@ -111,3 +111,6 @@ echo "Large host: 1000 switches, 4096 ports, 2000 port groups, 64 NICs, 256 inte
     "network firewall ruleset rule list" "$cli network firewall ruleset rule list" \
     "... ruleset allowedip add" "$cli network firewall ruleset allowedip add -r ruleset199 -i 203.0.113.250" \
     "... ruleset allowedip remove" "$cli network firewall ruleset allowedip remove -r ruleset199 -i 203.0.113.250"
+
+echo
+bench/batch.sh
