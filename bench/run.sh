@@ -135,3 +135,5 @@ echo "Ports, VMs and distributed switches, large host ($runs runs each):"
     "network vm port list" "$cli network vm port list -w 3000200" \
     "network port stats get" "$cli network port stats get -p $((200 * 16777216 + 33554433))" \
     "network vswitch dvs orvix list" "$cli network vswitch dvs orvix list"
+echo
+bench/batch.sh

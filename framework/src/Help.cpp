@@ -14,17 +14,32 @@ const char* const kGlobalOptions[][2] = {
     {"--formatter=<str>", "Override the output formatter: "},
     {"-h|--help", "Show the help of the namespace or command."},
     {"--version", "Print the version of the CLI and exit."},
+    {"--batch=<file>", "Run the command lines of a file, one a line (- reads standard input)."},
+    {"--force", "With --batch: run on past failing lines."},
 };
 
+// Whether a node is a command or has one somewhere below it. A namespace
+// without any would only lead to another empty listing.
+bool LeadsToCommand(NamespaceNode& node) {
+    if (node.AsCommand()) return true;
+    for (const auto& child : node.GetChildren()) {
+        if (LeadsToCommand(*child.second)) return true;
+    }
+    return false;
+}
+
 void RenderChildren(const NamespaceNode& node, bool commands, const char* title, std::ostream& out) {
+    auto listed = [&](const NamespaceNode::Child& child) {
+        return (child.second->AsCommand() != nullptr) == commands && LeadsToCommand(*child.second);
+    };
     std::size_t width = 0;
     for (const auto& child : node.GetChildren()) {
-        if ((child.second->AsCommand() != nullptr) == commands) width = std::max(width, child.first.size());
+        if (listed(child)) width = std::max(width, child.first.size());
     }
     if (width == 0) return;
     out << "\n" << title << ":\n";
     for (const auto& child : node.GetChildren()) {
-        if ((child.second->AsCommand() != nullptr) != commands) continue;
+        if (!listed(child)) continue;
         out << "  " << child.first << std::string(width - child.first.size() + 2, ' ') << child.second->GetDescription()
             << "\n";
     }

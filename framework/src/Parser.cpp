@@ -132,7 +132,42 @@ void StoreValue(const CallSpec::ParameterSpec& p, const std::string& text, CallS
     }
 }
 
+[[noreturn]] void UnknownOption(const CallSpec::InputSpec& declared, const std::string& option) {
+    std::vector<std::string> names, letters;
+    for (const auto& q : declared.GetParameters()) {
+        names.push_back(q->GetName());
+        if (!q->GetShortName().empty()) letters.push_back(q->GetShortName());
+    }
+    std::string message = "Unknown option " + option;
+    const std::string suggestion = SuggestOption(option, names, letters);
+    if (!suggestion.empty()) message += ". Did you mean " + suggestion + "?";
+    throw UsageError(message);
+}
+
 }  // namespace
+
+std::string SuggestOption(const std::string& option, const std::vector<std::string>& names,
+                          const std::vector<std::string>& letters) {
+    if (option.compare(0, 2, "--") == 0) {
+        const std::string name =
+            option.substr(2, option.find('=') == std::string::npos ? std::string::npos : option.find('=') - 2);
+        const std::string suggestion = SuggestClosest(name, names);
+        return suggestion.empty() ? suggestion : "--" + suggestion;
+    }
+    if (option.size() < 2 || option[0] != '-') return "";
+    if (option.size() == 2 || option[2] == '=') {
+        // Any two letters are one edit apart, so only the same letter in the
+        // other case is a likely slip.
+        const std::string letter = Lower(option.substr(1, 1));
+        for (const auto& candidate : letters) {
+            if (Lower(candidate) == letter) return "-" + candidate;
+        }
+        return "";
+    }
+    // A long name typed with one dash.
+    const std::string suggestion = SuggestClosest(option.substr(1), names);
+    return suggestion.empty() ? suggestion : "--" + suggestion;
+}
 
 bool ParseBoolWord(const std::string& text, bool& value) {
     const std::string word = Lower(text);
@@ -207,25 +242,11 @@ boost::shared_ptr<CallSpec::Input> ParseArguments(const CallSpec::InputSpec& dec
                 name.resize(eq);
             }
             p = declared.FindByName(name);
-            if (!p) {
-                std::vector<std::string> names;
-                for (const auto& q : declared.GetParameters()) names.push_back(q->GetName());
-                std::string message = "Unknown option --" + name;
-                std::string suggestion = SuggestClosest(name, names);
-                if (!suggestion.empty()) message += ". Did you mean --" + suggestion + "?";
-                throw UsageError(message);
-            }
+            if (!p) UnknownOption(declared, "--" + name);
         } else if (token.size() >= 2 && token[0] == '-' && token[1] != '-' && !LooksLikeNegativeNumber(token)) {
-            if (token.size() > 2 && token[2] != '=') {
-                std::vector<std::string> names;
-                for (const auto& q : declared.GetParameters()) names.push_back(q->GetName());
-                std::string message = "Unknown option " + token;
-                std::string suggestion = SuggestClosest(token.substr(1), names);
-                if (!suggestion.empty()) message += ". Did you mean --" + suggestion + "?";
-                throw UsageError(message);
-            }
+            if (token.size() > 2 && token[2] != '=') UnknownOption(declared, token);
             p = declared.FindByShortName(token.substr(1, 1));
-            if (!p) throw UsageError("Unknown option " + token.substr(0, 2));
+            if (!p) UnknownOption(declared, token.substr(0, 2));
             if (token.size() > 2) {
                 inlineValue = token.substr(3);
                 hasInlineValue = true;

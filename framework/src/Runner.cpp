@@ -35,6 +35,10 @@ bool IsOption(const std::string& token) {
     return !token.empty() && token[0] == '-';
 }
 
+// The options every namespace understands, for suggestions.
+const std::vector<std::string> kGlobalLongOptions = {"formatter", "help", "version"};
+const std::vector<std::string> kGlobalShortOptions = {"h"};
+
 std::string FormatterList() {
     return JoinNames(FormatterNames());
 }
@@ -64,6 +68,13 @@ CommandLine Resolve(const boost::shared_ptr<NamespaceNode>& root, const std::vec
             if (token.size() > 11) {
                 line.formatter = token.substr(12);
             } else if (i + 1 < args.size() && !IsOption(args[i + 1])) {
+                // "--formatter network ip get" forgot the name; taking the
+                // command word for it would only confuse what follows.
+                const std::string& next = args[i + 1];
+                if (!FindFormatter(next) && line.node->FindChild(next)) {
+                    throw UsageError("Option --formatter needs a value before the command word '" + next +
+                                     "': one of " + FormatterList());
+                }
                 line.formatter = args[++i];
             }
             // An empty name would otherwise pass as "no formatter chosen" and
@@ -75,8 +86,11 @@ CommandLine Resolve(const boost::shared_ptr<NamespaceNode>& root, const std::vec
             line.commandArgs.push_back(token);
         } else if (IsOption(token)) {
             if (line.help) continue;
-            throw UsageError("Unknown option " + token +
-                             (line.pathWords.empty() ? std::string() : " for '" + JoinPath(line.pathWords) + "'"));
+            std::string message = "Unknown option " + token +
+                                  (line.pathWords.empty() ? std::string() : " for '" + JoinPath(line.pathWords) + "'");
+            const std::string suggestion = SuggestOption(token, kGlobalLongOptions, kGlobalShortOptions);
+            if (!suggestion.empty()) message += ". Did you mean " + suggestion + "?";
+            throw UsageError(message);
         } else {
             boost::shared_ptr<NamespaceNode> child = line.node->FindChild(token);
             if (!child) {
@@ -96,8 +110,8 @@ CommandLine Resolve(const boost::shared_ptr<NamespaceNode>& root, const std::vec
     if (!line.formatter.empty() && !FindFormatter(line.formatter)) {
         std::string message = "Unknown formatter '" + line.formatter + "'";
         std::string suggestion = SuggestClosest(line.formatter, FormatterNames());
-        if (!suggestion.empty()) message += ". Did you mean '" + suggestion + "'?";
-        throw UsageError(message + " Formatters: " + FormatterList());
+        message += suggestion.empty() ? "." : ". Did you mean '" + suggestion + "'?";
+        throw UsageError(message + " Formatters: " + FormatterList() + ".");
     }
     return line;
 }

@@ -4,6 +4,7 @@
 
 #include <algorithm>
 #include <chrono>
+#include <cstdio>
 #include <random>
 #include <thread>
 
@@ -86,6 +87,7 @@ void HostStore::Impl::Run(Mode transactionMode, const std::function<void()>& bod
             db.Exec(transactionMode == Mode::Writing ? "BEGIN IMMEDIATE" : "BEGIN");
             body();
             db.Exec("COMMIT");
+            if (transactionMode == Mode::Writing && deferredSync && ++unsynced >= kDeferredSyncInterval) SyncLog();
             return;
         } catch (const Sql::BusyError&) {
             db.RollbackQuietly();
@@ -101,7 +103,19 @@ void HostStore::Impl::Run(Mode transactionMode, const std::function<void()>& bod
 
 HostStore::HostStore(const std::string& path) : path_(path), impl_(std::make_unique<Impl>(path)) {}
 
-HostStore::~HostStore() = default;
+HostStore::~HostStore() {
+    if (!impl_->deferredSync || impl_->unsynced == 0) return;
+    // The changes were reported done; one that cannot be made durable now
+    // must not end in success. A destructor cannot throw, and this one runs
+    // as the process ends, so the process ends here, failing.
+    try {
+        impl_->SyncLog();
+    } catch (const StoreError& e) {
+        std::fprintf(stderr, "%s\n", e.what());
+        std::fflush(stderr);
+        _exit(3);
+    }
+}
 
 void HostStore::Change(const std::function<void(Transaction&)>& fn) {
     impl_->Run(Impl::Mode::Writing, [&] {

@@ -28,12 +28,25 @@ struct HostStore::Impl {
     void RequireIdle() const;
     // The connection, for a write; only Change() may write.
     Sql::Database& Writable();
+    // Flushes the write-ahead log, and the directory holding it, to disk:
+    // every change committed so far then survives a power loss. Throws
+    // StoreError naming the store when the system refuses.
+    void SyncLog();
 
     Sql::Database db;
     Mode mode = Mode::Idle;
+    // Commits skip their own flush (ORVIX_HOST_SYNC=deferred); SyncLog runs
+    // every kDeferredSyncInterval changes and when the store is closed.
+    bool deferredSync = false;
+    // Changes committed since the log was last flushed, in that mode.
+    int unsynced = 0;
     // Set once the fault table was found empty; see CheckFault.
     bool noFaults = false;
 };
+
+// How many changes may wait for their flush to disk when syncing is
+// deferred: at most this many changes a power loss can take back.
+constexpr int kDeferredSyncInterval = 100;
 
 // The text of a key or parent field: a string as it is, an integer in
 // decimal. nullopt when the field is absent or null; ProfileError for any

@@ -381,6 +381,8 @@ TEST(KeyValueFormatter, KeysSpellThePath) {
               "VirtualSwitch.Uplinks[1]=hwnic1\n"
               "VirtualSwitch.MTU=1500\n"
               "VirtualSwitch.Comment=\n"
+              // A set but empty list keeps its key.
+              "VirtualSwitch.Portgroups=\n"
               "VirtualSwitch.Ports[0].ID=1\n"
               "VirtualSwitch.Ports[0].Client=vm1\n"
               "VirtualSwitch.Ports[1].ID=2\n"
@@ -389,6 +391,7 @@ TEST(KeyValueFormatter, KeysSpellThePath) {
     EXPECT_EQ(Render("keyvalue", SwitchList({Switch("a", 1, {}), Switch("b", 2, {"x"})})),
               "VirtualSwitch[0].Name=a\n"
               "VirtualSwitch[0].Num Ports=1\n"
+              "VirtualSwitch[0].Uplinks=\n"
               "VirtualSwitch[1].Name=b\n"
               "VirtualSwitch[1].Num Ports=2\n"
               "VirtualSwitch[1].Uplinks[0]=x\n");

@@ -104,6 +104,13 @@ boost::shared_ptr<AutoCli::Namespace> Tree() {
     inner->RegisterNamespaceNode(FakeCommand::New(FakeCommand::kLongList), "many");
     top->RegisterNamespaceNode(FakeCommand::New(FakeCommand::kRecord), "list");
     top->RegisterNamespaceNode(inner, "inner");
+    // Namespaces with no command anywhere below them.
+    auto empty = AutoCli::Namespace::New();
+    empty->SetDescription("Nothing here");
+    auto emptier = AutoCli::Namespace::New();
+    emptier->SetDescription("Nothing here either");
+    empty->RegisterNamespaceNode(emptier, "deeper");
+    top->RegisterNamespaceNode(empty, "hollow");
     root->RegisterNamespaceNode(top, "top");
     return root;
 }
@@ -148,10 +155,29 @@ TEST(Runner, RefusesBadCommandLines) {
     const std::vector<std::pair<std::vector<std::string>, std::string>> cases = {
         {{"tpo"}, "tool: Unknown command or namespace 'tpo'. Did you mean 'top'?\n"},
         {{"top", "--bogus"}, "tool: Unknown option --bogus for 'top'\n"},
+        // The options every namespace knows are suggested, long and short.
+        {{"top", "--formater=json"}, "tool: Unknown option --formater=json for 'top'. Did you mean --formatter?\n"},
+        {{"top", "-H"}, "tool: Unknown option -H for 'top'. Did you mean -h?\n"},
+        {{"-x"}, "tool: Unknown option -x\n"},
+        // A command's own short options are suggested by case.
+        {{"top", "list", "-N", "alpha"},
+         "tool: Unknown option -N. Did you mean -n?\nRun 'tool top list --help' for its options.\n"},
+        {{"top", "list", "-n", "alpha", "-F"},
+         "tool: Unknown option -F. Did you mean -f?\nRun 'tool top list --help' for its options.\n"},
+        {{"top", "list", "-q"}, "tool: Unknown option -q\nRun 'tool top list --help' for its options.\n"},
         // What the user typed is echoed with its control characters escaped.
         {{"top", "--bo\x1b]0;x\x07gus"}, "tool: Unknown option --bo\\x1b]0;x\\x07gus for 'top'\n"},
         {{"--formatter=jsno", "top", "list", "-n", "alpha"},
-         "tool: Unknown formatter 'jsno'. Did you mean 'json'? Formatters: simple, table, json, xml, csv, keyvalue\n"},
+         "tool: Unknown formatter 'jsno'. Did you mean 'json'? Formatters: simple, table, json, xml, csv, keyvalue.\n"},
+        {{"--formatter=bogus", "top", "list", "-n", "alpha"},
+         "tool: Unknown formatter 'bogus'. Formatters: simple, table, json, xml, csv, keyvalue.\n"},
+        // The command word after a bare --formatter is not taken for its value.
+        {{"--formatter", "top", "list", "-n", "alpha"},
+         "tool: Option --formatter needs a value before the command word 'top': one of simple, table, json, xml, "
+         "csv, keyvalue\n"},
+        {{"top", "--formatter", "inner", "get", "-n", "alpha"},
+         "tool: Option --formatter needs a value before the command word 'inner': one of simple, table, json, xml, "
+         "csv, keyvalue\n"},
         {{"top", "list", "-n", "alpha", "--formatter"},
          "tool: Option --formatter needs a value: one of simple, table, json, xml, csv, keyvalue\n"},
         {{"top", "list", "-n", "alpha", "--formatter="},
@@ -180,13 +206,16 @@ TEST(Runner, HelpAtEveryLevel) {
               "  --formatter=<str>   Override the output formatter: simple, table, json, xml, csv, keyvalue.\n"
               "  -h|--help           Show the help of the namespace or command.\n"
               "  --version           Print the version of the CLI and exit.\n"
+              "  --batch=<file>      Run the command lines of a file, one a line (- reads standard input).\n"
+              "  --force             With --batch: run on past failing lines.\n"
               "\n"
               "Available Namespaces:\n"
               "  top  Top things\n"
               "\n"
               "For help on a namespace or command: tool <name> --help\n");
 
-    // Children in their order of attachment, namespaces and commands apart.
+    // Children in their order of attachment, namespaces and commands apart;
+    // "hollow", with no command anywhere below it, is not listed.
     Outcome ns = RunLine({"top", "--help"});
     EXPECT_EQ(ns.out,
               "Usage: tool top {namespace|cmd} [cmd options]\n"

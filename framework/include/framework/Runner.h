@@ -44,6 +44,12 @@ AUTOCLI_EXPORT bool ParseInt64(const std::string& text, std::int64_t& value);
 
 // The closest of the candidates to a mistyped word, or "" when none is close.
 AUTOCLI_EXPORT std::string SuggestClosest(const std::string& word, const std::vector<std::string>& candidates);
+// The option a mistyped one most likely meant, written with its dashes, or
+// "" when none is close: for "--name" (or "--name=value") the closest of the
+// long names, for "-x" a short name that differs only in case ("-P" for
+// "-p"), for "-name" the closest long name.
+AUTOCLI_EXPORT std::string SuggestOption(const std::string& option, const std::vector<std::string>& names,
+                                         const std::vector<std::string>& letters);
 
 // Help texts. `path` is the command path as typed ("network ip set").
 AUTOCLI_EXPORT void RenderNamespaceHelp(const NamespaceNode& node, const std::string& program, const std::string& path,

@@ -61,6 +61,9 @@ private:
             }
         } else if (const MetaList* list = AsList(&value)) {
             std::vector<const MetaObject*> elements = PresentElements(*list);
+            // A list that was set but holds nothing still shows its key, so
+            // a script tells it from a field the command never set.
+            if (elements.empty()) out_ << key << "=\n";
             for (std::size_t i = 0; i < elements.size(); ++i) Value(Indexed(key, i), *elements[i]);
         } else {
             out_ << key << '=' << Escape(ScalarText(value)) << '\n';

@@ -141,6 +141,7 @@ PortGroupFailoverPolicy.Load Balancing=iphash
 PortGroupFailoverPolicy.Network Failure Detection=beacon
 PortGroupFailoverPolicy.Notify Switches=false
 PortGroupFailoverPolicy.Failback=true
+PortGroupFailoverPolicy.Active Adapters=
 PortGroupFailoverPolicy.Standby Adapters[0]=hwnic1
 PortGroupFailoverPolicy.Unused Adapters[0]=hwnic0
 PortGroupFailoverPolicy.Override Vswitch Load Balancing=false

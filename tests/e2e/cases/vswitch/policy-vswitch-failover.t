@@ -104,6 +104,7 @@ VirtualSwitchFailoverPolicy.Load Balancing=explicit
 VirtualSwitchFailoverPolicy.Network Failure Detection=link
 VirtualSwitchFailoverPolicy.Notify Switches=true
 VirtualSwitchFailoverPolicy.Failback=true
+VirtualSwitchFailoverPolicy.Active Adapters=
 VirtualSwitchFailoverPolicy.Standby Adapters[0]=hwnic1
 VirtualSwitchFailoverPolicy.Unused Adapters[0]=hwnic0
 VirtualSwitchFailoverPolicy.Unused Adapters[1]=hwnic2

@@ -14,6 +14,9 @@ VirtualSwitch[0].CDP Status=listen
 VirtualSwitch[0].Beacon Enabled=false
 VirtualSwitch[0].Beacon Interval=1
 VirtualSwitch[0].Beacon Threshold=3
+VirtualSwitch[0].Beacon Required By=
+VirtualSwitch[0].Uplinks=
+VirtualSwitch[0].Portgroups=
 
 ## In JSON the operation's result is the boolean true.
 $ orvixcli network vswitch standard add -v vSwitch3 -P 16 --formatter=json
@@ -30,6 +33,9 @@ VirtualSwitch[0].CDP Status=listen
 VirtualSwitch[0].Beacon Enabled=false
 VirtualSwitch[0].Beacon Interval=1
 VirtualSwitch[0].Beacon Threshold=3
+VirtualSwitch[0].Beacon Required By=
+VirtualSwitch[0].Uplinks=
+VirtualSwitch[0].Portgroups=
 
 ## A name in use is refused by the library, with its message.
 $ orvixcli network vswitch standard add --vswitch-name=vSwitch0

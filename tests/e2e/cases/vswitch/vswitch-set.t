@@ -33,6 +33,8 @@ VirtualSwitch[0].CDP Status=down
 VirtualSwitch[0].Beacon Enabled=false
 VirtualSwitch[0].Beacon Interval=1
 VirtualSwitch[0].Beacon Threshold=3
+VirtualSwitch[0].Beacon Required By=
+VirtualSwitch[0].Uplinks=
 VirtualSwitch[0].Portgroups[0]=Lab Isolated
 
 $ orvixcli network vswitch standard set -v vSwitch1 -m 9000 --formatter=json
@@ -52,6 +54,8 @@ VirtualSwitch[0].CDP Status=listen
 VirtualSwitch[0].Beacon Enabled=false
 VirtualSwitch[0].Beacon Interval=1
 VirtualSwitch[0].Beacon Threshold=3
+VirtualSwitch[0].Beacon Required By=
+VirtualSwitch[0].Uplinks=
 VirtualSwitch[0].Portgroups[0]=Lab Isolated
 
 $ orvixcli network vswitch standard set -v vSwitch1 --cdp-status=advertise
@@ -67,6 +71,8 @@ VirtualSwitch[0].CDP Status=advertise
 VirtualSwitch[0].Beacon Enabled=false
 VirtualSwitch[0].Beacon Interval=1
 VirtualSwitch[0].Beacon Threshold=3
+VirtualSwitch[0].Beacon Required By=
+VirtualSwitch[0].Uplinks=
 VirtualSwitch[0].Portgroups[0]=Lab Isolated
 
 $ orvixcli network vswitch standard set -v vSwitch1 -c both
@@ -82,6 +88,8 @@ VirtualSwitch[0].CDP Status=both
 VirtualSwitch[0].Beacon Enabled=false
 VirtualSwitch[0].Beacon Interval=1
 VirtualSwitch[0].Beacon Threshold=3
+VirtualSwitch[0].Beacon Required By=
+VirtualSwitch[0].Uplinks=
 VirtualSwitch[0].Portgroups[0]=Lab Isolated
 
 $ orvixcli network vswitch standard set -v vSwitch1 --cdp-status=down
@@ -97,6 +105,8 @@ VirtualSwitch[0].CDP Status=down
 VirtualSwitch[0].Beacon Enabled=false
 VirtualSwitch[0].Beacon Interval=1
 VirtualSwitch[0].Beacon Threshold=3
+VirtualSwitch[0].Beacon Required By=
+VirtualSwitch[0].Uplinks=
 VirtualSwitch[0].Portgroups[0]=Lab Isolated
 
 ## Both at once; a bad MTU stops the command before the CDP status is

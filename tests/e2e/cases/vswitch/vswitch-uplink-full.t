@@ -19,4 +19,6 @@ VirtualSwitch[0].CDP Status=listen
 VirtualSwitch[0].Beacon Enabled=false
 VirtualSwitch[0].Beacon Interval=1
 VirtualSwitch[0].Beacon Threshold=3
+VirtualSwitch[0].Beacon Required By=
 VirtualSwitch[0].Uplinks[0]=hwnic0
+VirtualSwitch[0].Portgroups=

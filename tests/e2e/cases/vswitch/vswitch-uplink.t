@@ -79,6 +79,7 @@ VirtualSwitch[0].CDP Status=down
 VirtualSwitch[0].Beacon Enabled=false
 VirtualSwitch[0].Beacon Interval=1
 VirtualSwitch[0].Beacon Threshold=3
+VirtualSwitch[0].Beacon Required By=
 VirtualSwitch[0].Uplinks[0]=hwnic4
 VirtualSwitch[0].Uplinks[1]=hwnic1
 VirtualSwitch[0].Portgroups[0]=Lab Isolated
@@ -97,6 +98,7 @@ VirtualSwitch[0].CDP Status=down
 VirtualSwitch[0].Beacon Enabled=false
 VirtualSwitch[0].Beacon Interval=1
 VirtualSwitch[0].Beacon Threshold=3
+VirtualSwitch[0].Beacon Required By=
 VirtualSwitch[0].Uplinks[0]=hwnic1
 VirtualSwitch[0].Portgroups[0]=Lab Isolated
 
