@@ -45,6 +45,18 @@ AUTOCLI_EXPORT bool ParseInt64(const std::string& text, std::int64_t& value);
 // The closest of the candidates to a mistyped word, or "" when none is close.
 AUTOCLI_EXPORT std::string SuggestClosest(const std::string& word, const std::vector<std::string>& candidates);
 
+// An option the CLI understands wherever it appears (--version only in a
+// namespace): help, completion and the manual pages all list these.
+struct GlobalOption {
+    std::string longName;
+    std::string shortName;  // "" when it has none
+    bool takesValue;
+    std::string description;
+};
+AUTOCLI_EXPORT const std::vector<GlobalOption>& GlobalOptions();
+// "-h|--help", "--formatter=<str>": the option as help shows it.
+AUTOCLI_EXPORT std::string GlobalOptionSynopsis(const GlobalOption& option);
+
 // Help texts. `path` is the command path as typed ("network ip set").
 AUTOCLI_EXPORT void RenderNamespaceHelp(const NamespaceNode& node, const std::string& program, const std::string& path,
                                         std::ostream& out);
