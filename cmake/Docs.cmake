@@ -40,7 +40,7 @@ if(ORVIX_BUILD_TESTS)
   # and man read every page.
   add_test(NAME ShellCompletion
            COMMAND ${PROJECT_SOURCE_DIR}/tests/shell/completion.sh ${CMAKE_BINARY_DIR}
-                   ${PROJECT_SOURCE_DIR}/tests/hoststore/fixtures/small-host.json)
+                   ${PROJECT_SOURCE_DIR}/profiles/default.json)
   add_test(NAME ManualPages COMMAND ${PROJECT_SOURCE_DIR}/tests/shell/manpages.sh ${CMAKE_BINARY_DIR})
   set_tests_properties(ShellCompletion ManualPages PROPERTIES TIMEOUT 120)
 endif()

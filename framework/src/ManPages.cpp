@@ -300,8 +300,10 @@ std::string RoffText(const std::string& text) {
     std::string out;
     std::istringstream lines(text);
     for (std::string line; std::getline(lines, line);) {
-        // A blank at the start of a line would break the filled text there.
+        // A blank at the start of a line would break the filled text there;
+        // one at the end is noise that checkers of pages complain about.
         line.erase(0, line.find_first_not_of(" \t"));
+        line.erase(line.find_last_not_of(" \t") + 1);
         if (line.empty()) continue;
         if (!out.empty()) out += '\n';
         if (line[0] == '.' || line[0] == '\'') out += "\\&";
