@@ -4,10 +4,12 @@
 
 #include <cstdlib>
 #include <iostream>
+#include <optional>
 #include <string>
 #include <vector>
 
 #include "PluginLoader.h"
+#include "SupportEntries.h"
 #include "framework/Batch.h"
 #include "framework/Runner.h"
 
@@ -29,6 +31,7 @@ void DeferSyncForFileBatch(const AutoCli::BatchInvocation& batch) {
 int main(int argc, char** argv) {
     std::ios::sync_with_stdio(false);
     const std::vector<std::string> args(argv + 1, argv + argc);
+    if (std::optional<int> status = OrvixCli::RunSupportEntry(args)) return *status;
 
     AutoCli::RunOptions options;
     options.program = "orvixcli";

@@ -1,6 +1,7 @@
 #include "framework/AutoCli.h"
 
 #include <stdexcept>
+#include <utility>
 
 namespace AutoCli {
 
@@ -18,6 +19,17 @@ boost::shared_ptr<NamespaceNode> NamespaceNode::FindChild(const std::string& nam
         if (child.first == name) return child.second;
     }
     return boost::shared_ptr<NamespaceNode>();
+}
+
+void NamespaceNode::SetValueCompleter(const std::string& parameterName, ValueCompleter completer) {
+    if (parameterName.empty()) throw std::invalid_argument("SetValueCompleter: empty parameter name");
+    if (!completer) throw std::invalid_argument("SetValueCompleter: no completer for '" + parameterName + "'");
+    valueCompleters_[parameterName] = std::move(completer);
+}
+
+const NamespaceNode::ValueCompleter* NamespaceNode::FindValueCompleter(const std::string& parameterName) const {
+    auto it = valueCompleters_.find(parameterName);
+    return it == valueCompleters_.end() ? nullptr : &it->second;
 }
 
 boost::shared_ptr<Namespace> Namespace::New() {

@@ -9,15 +9,6 @@ namespace AutoCli {
 
 namespace {
 
-// Options the CLI understands wherever they appear.
-const char* const kGlobalOptions[][2] = {
-    {"--formatter=<str>", "Override the output formatter: "},
-    {"-h|--help", "Show the help of the namespace or command."},
-    {"--version", "Print the version of the CLI and exit."},
-    {"--batch=<file>", "Run the command lines of a file, one a line (- reads standard input)."},
-    {"--force", "With --batch: run on past failing lines."},
-};
-
 // Whether a node is a command or has one somewhere below it. A namespace
 // without any would only lead to another empty listing.
 bool LeadsToCommand(NamespaceNode& node) {
@@ -74,6 +65,22 @@ std::string ReplaceAll(std::string text, const std::string& token, const std::st
 
 }  // namespace
 
+const std::vector<GlobalOption>& GlobalOptions() {
+    static const std::vector<GlobalOption> kOptions = {
+        {"formatter", "", true, "Override the output formatter: " + JoinNames(FormatterNames()) + "."},
+        {"help", "h", false, "Show the help of the namespace or command."},
+        {"version", "", false, "Print the version of the CLI and exit."},
+        {"batch", "", true, "Run the command lines of a file, one a line (- reads standard input).", "file", true},
+        {"force", "", false, "With --batch: run on past failing lines.", "str", true},
+    };
+    return kOptions;
+}
+
+std::string GlobalOptionSynopsis(const GlobalOption& option) {
+    return (option.shortName.empty() ? "" : "-" + option.shortName + "|") + "--" + option.longName +
+           (option.takesValue ? "=<" + option.valueName + ">" : "");
+}
+
 std::string ExpandDescription(const CallSpec::ParameterSpec& parameter, const std::string& indent) {
     std::string text = parameter.GetDescription();
     const auto& c = parameter.GetConstraint();
@@ -101,10 +108,9 @@ void RenderNamespaceHelp(const NamespaceNode& node, const std::string& program, 
     if (!node.GetDescription().empty()) out << "\n" << node.GetDescription() << "\n";
     if (path.empty()) {
         out << "\nOptions:\n";
-        for (const auto& option : kGlobalOptions) {
-            std::string text = option[1];
-            if (std::string(option[0]).rfind("--formatter", 0) == 0) text += JoinNames(FormatterNames()) + ".";
-            out << "  " << option[0] << std::string(20 - std::string(option[0]).size(), ' ') << text << "\n";
+        for (const auto& option : GlobalOptions()) {
+            const std::string synopsis = GlobalOptionSynopsis(option);
+            out << "  " << synopsis << std::string(20 - synopsis.size(), ' ') << option.description << "\n";
         }
     }
     RenderChildren(node, false, "Available Namespaces", out);

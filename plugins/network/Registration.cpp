@@ -7,6 +7,7 @@
 // left untouched and no partial tree is ever visible.
 #include <boost/shared_ptr.hpp>
 
+#include "common/ValueCompleters.h"
 #include "firewall/FirewallGet.h"
 #include "firewall/FirewallLoad.h"
 #include "firewall/FirewallRefresh.h"
@@ -504,5 +505,6 @@ extern "C" __attribute__((visibility("default"))) void AutoCli_RegisterNamespace
     // network vswitch dvs orvix lacp timeout
     vswitchDvsOrvixLacpTimeout->RegisterNamespaceNode(LacpSetTimeout::New(), "set");
 
+    AttachValueCompleters(*network);
     parent->RegisterNamespaceNode(network, "network");
 }

@@ -1,6 +1,7 @@
 // The command tree: namespaces and commands, held by boost::shared_ptr.
 #pragma once
 
+#include <functional>
 #include <map>
 #include <string>
 #include <utility>
@@ -37,12 +38,26 @@ public:
     // Non-null when this node is a command.
     virtual Command* AsCommand() { return nullptr; }
 
+    // Candidate values of a parameter, offered by shell completion. It may
+    // read anything it likes (the host, a file); completion shows nothing of
+    // a completer that throws.
+    using ValueCompleter = std::function<std::vector<std::string>()>;
+
+    // Offers candidates for the parameter of that long name in every command
+    // at or below this node, unless a node nearer the command offers its own
+    // for the same name. This lets a plug-in say once, per part of its tree,
+    // what a name such as "nic-name" refers to.
+    void SetValueCompleter(const std::string& parameterName, ValueCompleter completer);
+    // The completer this node itself offers for the name; null when none.
+    const ValueCompleter* FindValueCompleter(const std::string& parameterName) const;
+
 protected:
     NamespaceNode() = default;
 
 private:
     std::string description_;
     std::vector<Child> children_;
+    std::map<std::string, ValueCompleter> valueCompleters_;
 };
 
 class AUTOCLI_EXPORT Namespace : public virtual NamespaceNode {

@@ -51,6 +51,22 @@ AUTOCLI_EXPORT std::string SuggestClosest(const std::string& word, const std::ve
 AUTOCLI_EXPORT std::string SuggestOption(const std::string& option, const std::vector<std::string>& names,
                                          const std::vector<std::string>& letters);
 
+// An option the CLI understands wherever it appears (--version only in a
+// namespace): help, completion and the manual pages all list these.
+struct GlobalOption {
+    std::string longName;
+    std::string shortName;  // "" when it has none
+    bool takesValue;
+    std::string description;
+    // What its value is, as help shows it ("--formatter=<str>").
+    std::string valueName = "str";
+    // Taken only before the first namespace word (--batch, --force).
+    bool leadingOnly = false;
+};
+AUTOCLI_EXPORT const std::vector<GlobalOption>& GlobalOptions();
+// "-h|--help", "--formatter=<str>": the option as help shows it.
+AUTOCLI_EXPORT std::string GlobalOptionSynopsis(const GlobalOption& option);
+
 // Help texts. `path` is the command path as typed ("network ip set").
 AUTOCLI_EXPORT void RenderNamespaceHelp(const NamespaceNode& node, const std::string& program, const std::string& path,
                                         std::ostream& out);

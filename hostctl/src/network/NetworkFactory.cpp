@@ -2,9 +2,9 @@
 
 #include "Operation.h"
 #include "hostctl/network/NetworkInfoImpl.h"
+#include "hostctl/network/dvs/DVSwitchImpl.h"
 #include "hostctl/network/ip/PldNic.h"
 #include "hostctl/network/vswitch/SwitchImpl.h"
-#include "hostctl/network/dvs/DVSwitchImpl.h"
 #include "network/dvs/DvsRecords.h"
 #include "network/vswitch/VswitchRecords.h"
 
