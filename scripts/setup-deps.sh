@@ -11,6 +11,7 @@ packages=(
   libgtest-dev libgmock-dev libexpat1-dev
   clang-format
   clang-14 libclang-rt-14-dev
+  dpkg-dev file lintian graphviz
 )
 
 missing=()
