@@ -19,8 +19,9 @@ if ! command -v dpkg >/dev/null; then
     exit 77
 fi
 # An installation the test did not make holds someone's host: never purge it.
-if dpkg-query -W -f='${Status}' orvixcli 2>/dev/null | grep -q 'installed\|config-files'; then
-    echo "the orvixcli package is installed already; remove it first (dpkg --purge orvixcli)" >&2
+status=$(dpkg-query -W -f='${db:Status-Status}' orvixcli 2>/dev/null || true)
+if [ -n "$status" ] && [ "$status" != not-installed ]; then
+    echo "the orvixcli package is on this machine already ($status); remove it first (dpkg --purge orvixcli)" >&2
     exit 1
 fi
 
