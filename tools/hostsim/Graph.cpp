@@ -3,6 +3,7 @@
 #include <arpa/inet.h>
 
 #include <cstdint>
+#include <functional>
 #include <map>
 #include <sstream>
 #include <utility>
@@ -163,6 +164,22 @@ std::string LagOf(const Json& dvswitch, const std::string& nic) {
     return "";
 }
 
+// Switches of one kind with their uplinks, each uplink edge labelled by
+// `uplinkLabel`.
+void DrawSwitches(DotWriter& dot, const std::vector<Json>& switches, const std::string& kind, const std::string& word,
+                  const std::string& fill,
+                  const std::function<std::string(const Json&, const std::string&)>& uplinkLabel) {
+    for (const Json& vswitch : switches) {
+        const std::string name = Text(vswitch, "name");
+        const std::string id =
+            dot.Node(kind, name, {name, word, "MTU " + std::to_string(Integer(vswitch, "mtu", 1500))},
+                     "shape=box3d, style=filled, fillcolor=\"" + fill + "\"");
+        for (const std::string& nic : Texts(vswitch, "uplinks")) {
+            dot.Edge(dot.Ref("nic", nic, "NIC"), id, "label=" + DotLabel({uplinkLabel(vswitch, nic)}));
+        }
+    }
+}
+
 std::vector<std::string> InterfaceLines(const Json& interface) {
     std::vector<std::string> lines = {Text(interface, "name")};
     const std::string mode = Text(interface, "ipv4Mode", "none");
@@ -254,25 +271,13 @@ void WriteDot(const Topology& topology, std::ostream& out) {
         lines.push_back(Integer(netstack, "state", 4660) == 4660 ? "netstack" : "netstack, configured only");
         dot.Node("ns", key, lines, "shape=ellipse, style=filled, fillcolor=\"#fff2cc\"");
     }
-    for (const Json& vswitch : topology.vswitches) {
-        const std::string name = Text(vswitch, "name");
-        const std::string id =
-            dot.Node("vsw", name, {name, "standard switch", "MTU " + std::to_string(Integer(vswitch, "mtu", 1500))},
-                     "shape=box3d, style=filled, fillcolor=\"#dae8fc\"");
-        for (const std::string& nic : Texts(vswitch, "uplinks")) {
-            dot.Edge(dot.Ref("nic", nic, "NIC"), id, "label=" + DotLabel({"uplink, " + UplinkRole(vswitch, nic)}));
-        }
-    }
-    for (const Json& dvswitch : topology.dvswitches) {
-        const std::string name = Text(dvswitch, "name");
-        const std::string id =
-            dot.Node("dvs", name, {name, "distributed switch", "MTU " + std::to_string(Integer(dvswitch, "mtu", 1500))},
-                     "shape=box3d, style=filled, fillcolor=\"#d5e8d4\"");
-        for (const std::string& nic : Texts(dvswitch, "uplinks")) {
-            const std::string lag = LagOf(dvswitch, nic);
-            dot.Edge(dot.Ref("nic", nic, "NIC"), id, "label=" + DotLabel({lag.empty() ? "uplink" : "uplink, " + lag}));
-        }
-    }
+    DrawSwitches(dot, topology.vswitches, "vsw", "standard switch", "#dae8fc",
+                 [](const Json& vswitch, const std::string& nic) { return "uplink, " + UplinkRole(vswitch, nic); });
+    DrawSwitches(dot, topology.dvswitches, "dvs", "distributed switch", "#d5e8d4",
+                 [](const Json& dvswitch, const std::string& nic) {
+                     const std::string lag = LagOf(dvswitch, nic);
+                     return lag.empty() ? std::string("uplink") : "uplink, " + lag;
+                 });
     for (const Json& portgroup : topology.portgroups) {
         const std::string name = Text(portgroup, "name");
         const std::string id = dot.Node("pg", name, {name, VlanText(Integer(portgroup, "vlanId", 0))}, "shape=tab");
