@@ -14,13 +14,15 @@ namespace {
 using RegisterFunction = void (*)(boost::shared_ptr<AutoCli::Namespace>);
 constexpr const char* kEntryPoint = "AutoCli_RegisterNamespaces";
 
+// The folder of this executable; empty when it cannot be known (no /proc,
+// as in a bare chroot).
 std::string ExecutableDirectory() {
     std::string buffer(4096, '\0');
     ssize_t n = readlink("/proc/self/exe", &buffer[0], buffer.size() - 1);
-    if (n <= 0) return ".";
+    if (n <= 0) return "";
     buffer.resize(static_cast<std::size_t>(n));
     std::size_t slash = buffer.rfind('/');
-    return slash == std::string::npos ? "." : buffer.substr(0, slash);
+    return slash == std::string::npos ? "" : buffer.substr(0, slash);
 }
 
 std::vector<std::string> SharedObjectsIn(const std::string& dir) {
@@ -52,7 +54,11 @@ std::vector<std::string> PluginDirectories() {
         }
         return dirs;
     }
-    dirs.push_back(ExecutableDirectory() + "/../lib/orvixcli/plugins");
+    // Without its own folder the CLI takes the installation's plug-in folder
+    // chosen at build time, never one relative to the working directory,
+    // where anybody's code could be waiting to be loaded.
+    const std::string executable = ExecutableDirectory();
+    dirs.push_back(executable.empty() ? ORVIX_INSTALLED_PLUGIN_DIR : executable + "/../lib/orvixcli/plugins");
     return dirs;
 }
 

@@ -12,7 +12,9 @@
 namespace OrvixCli {
 
 // The plug-in folders: $ORVIX_PLUGIN_PATH (folders separated by ':') when
-// set, else lib/orvixcli/plugins beside the executable's bin folder.
+// set, else lib/orvixcli/plugins beside the executable's bin folder (the
+// same in the build tree and in an installation), else, when the
+// executable's folder cannot be found, the installation's plug-in folder.
 std::vector<std::string> PluginDirectories();
 
 // Loads every "*.so" of the folders, in name order, and calls its

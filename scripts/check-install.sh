@@ -19,7 +19,7 @@ dump=$("$work/moved/bin/orvix-hostsim" dump)
 grep -q '"format": "orvix-host-profile"' <<<"$dump" || { echo "installed orvix-hostsim dumped: $dump" >&2; exit 1; }
 # No installed program or library may still look for libraries in the
 # build tree.
-for file in "$work"/moved/bin/* "$work"/moved/lib/*.so "$work"/moved/lib/orvixcli/plugins/*.so; do
+for file in "$work"/moved/bin/* "$work"/moved/lib/orvixcli/*.so "$work"/moved/lib/orvixcli/plugins/*.so; do
     if readelf -d "$file" | grep -E 'R(UN)?PATH' | grep -qF "$(cd "$build" && pwd)"; then
         echo "$file: its run path names the build tree" >&2
         exit 1

@@ -12,6 +12,7 @@ packages=(
   clang-format
   clang-14 libclang-rt-14-dev
   bash-completion zsh tmux groff man-db
+  dpkg-dev file lintian graphviz
 )
 
 missing=()

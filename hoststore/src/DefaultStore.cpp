@@ -29,6 +29,11 @@ std::unique_ptr<HostStore>& DefaultStore() {
 std::string HostStore::ResolvePath() {
     const std::string db = Env("ORVIX_HOST_DB");
     if (!db.empty()) return db;
+#ifdef ORVIX_SYSTEM_HOST_DB
+    // An installed package simulates one host for the whole machine, made by
+    // its installation; every user and every environment finds the same one.
+    return ORVIX_SYSTEM_HOST_DB;
+#else
     std::string state = Env("XDG_STATE_HOME");
     if (state.empty()) {
         const std::string home = Env("HOME");
@@ -36,6 +41,7 @@ std::string HostStore::ResolvePath() {
         state = home + "/.local/state";
     }
     return state + "/orvix/host.db";
+#endif
 }
 
 std::string HostStore::ResolveProfileOrigin() {

@@ -10,6 +10,7 @@
 #include <string>
 #include <vector>
 
+#include "Graph.h"
 #include "hoststore/HostStore.h"
 #include "orvixtext/Utf8.h"
 
@@ -155,6 +156,11 @@ int FaultClear(const Arguments&) {
     return kOk;
 }
 
+int Graph(const Arguments&) {
+    OrvixHostsim::WriteDot(OrvixHostsim::ReadTopology(HostStore::Default()), std::cout);
+    return kOk;
+}
+
 int Path(const Arguments&) {
     std::cout << HostStore::ResolvePath() << '\n';
     return kOk;
@@ -201,6 +207,15 @@ const std::vector<Command>& Commands() {
          "remaining firings (\"always\" when unlimited) and message.",
          FaultList},
         {"fault clear", {}, {}, "remove every fault", "Removes every armed fault.", FaultClear},
+        {"graph",
+         {},
+         {},
+         "write the host's topology as a Graphviz graph",
+         "Writes the host's network topology in Graphviz DOT: physical NICs, standard and distributed\n"
+         "switches with their uplinks, port groups with their VLAN IDs, DV ports, kernel interfaces with\n"
+         "their addresses and netstacks, and the ports of virtual machines. A reference to an object that\n"
+         "does not exist is drawn dashed and marked \"missing\". To draw it: orvix-hostsim graph | dot -Tsvg",
+         Graph},
         {"path", {}, {}, "print the store's path", "Prints the path of the store the other commands use.", Path},
     };
     return commands;
@@ -230,7 +245,12 @@ void PrintHelp() {
     }
     std::cout << "\nOptions:\n"
                  "  --db PATH   the store to use, instead of $ORVIX_HOST_DB or\n"
+#ifdef ORVIX_SYSTEM_HOST_DB
+                 "              " ORVIX_SYSTEM_HOST_DB
+                 "\n"
+#else
                  "              ${XDG_STATE_HOME:-$HOME/.local/state}/orvix/host.db\n"
+#endif
                  "  -h, --help  this help; COMMAND --help shows a command's help\n\n"
                  "Exit status: 0 done, 1 the request failed, 2 usage error, 3 the store cannot be used.\n";
 }
