@@ -253,13 +253,18 @@ void AddDvSwitch(int d, Json& nics, Json& dvswitches, Json& dvports, Json& ports
         for (int k = lag * 2; k < lag * 2 + 2; ++k) {
             const int n = kStandardUplinkNics + d * kDvUplinks + k;
             const bool link = HasLink(n);
+            // Aggregatable and either in sync, collecting and distributing
+            // (0x3c) or defaulted (0x44); bit 0 marks the active mode.
             const int localState = (active ? 1 : 0) | (link ? 0x3c : 0x44);
             members.push_back(
                 {{"nic", "hwnic" + std::to_string(n)},
                  {"state", link ? "Bundled" : "Down"},
                  {"shortTimeout", false},
                  {"local",
-                  {{"adminKey", 9 + lag}, {"operKey", 9 + lag}, {"portPriority", 255}, {"portNumber", k + 1},
+                  {{"adminKey", 9 + lag},
+                   {"operKey", 9 + lag},
+                   {"portPriority", 255},
+                   {"portNumber", k + 1},
                    {"state", localState}}},
                  {"partner",
                   {{"deviceId", link ? Mac(0xfe, d) : "00:00:00:00:00:00"},
