@@ -1,9 +1,10 @@
-// Writes a large host profile on stdout, for the benchmark: about 1000
-// standard switches with 4096 ports in all, 2000 port groups, 256 kernel
+// Writes a large host profile on stdout, for the benchmark: 1000 standard and
+// 8 distributed switches with 4096 ports in all, 2000 port groups, 256 kernel
 // interfaces over 16 netstacks, 10000 IPv4 routes (and 256 IPv6 ones), 2000
-// neighbors, 5000 connections of 64 worlds, 64 NICs with their driver data
-// and 200 firewall rulesets with 5000 rules and 2000 allowed addresses.
-// Deterministic: the same profile every time.
+// neighbors, 5000 connections of 64 worlds, 500 virtual machines with ports on
+// both kinds of switch, 64 NICs with their driver data (the last 32 in the
+// LAGs of the distributed switches) and 200 firewall rulesets with 5000 rules
+// and 2000 allowed addresses. Deterministic: the same profile every time.
 #include <cstdint>
 #include <cstdio>
 #include <iostream>
@@ -16,7 +17,14 @@ using Json = nlohmann::json;
 namespace {
 
 constexpr int kSwitches = 1000;
+constexpr int kDvSwitches = 8;
+// Each distributed switch has four uplinks in two LAGs, 64 VM ports and 12
+// free ones; the standard switches share the rest of the 4096 ports.
+constexpr int kDvUplinks = 4;
+constexpr int kDvVmPorts = 64;
+constexpr int kDvPorts = 80;
 constexpr int kPorts = 4096;
+constexpr int kStandardPorts = kPorts - kDvSwitches * kDvPorts;
 constexpr int kPortGroupsPerSwitch = 2;
 constexpr int kInterfaces = 256;
 constexpr int kNetstacks = 16;
@@ -25,13 +33,27 @@ constexpr int kIpv6Routes = 256;
 constexpr int kNeighbors = 2000;
 constexpr int kConnections = 5000;
 constexpr int kWorlds = 64;
+constexpr int kVms = 500;
 constexpr int kNics = 64;
-constexpr long long kPortBlock = 1LL << 24;
+// NICs hwnic0 to hwnic31 are uplinks of the first standard switches, the
+// others of the distributed switches.
+constexpr int kStandardUplinkNics = kNics - kDvSwitches * kDvUplinks;
+// Every switch has a block of port ids; switch n (standard ones first, then
+// the distributed ones) starts at (n + 2) * kPortBlock + 1. The blocks are
+// small enough for every id of the host to stay within 32 bits, as port ids
+// must.
+constexpr long long kPortBlock = 1LL << 16;
 constexpr int kRulesets = 200;
 constexpr int kRulesPerRuleset = 25;       // 5000 rules
 constexpr int kAllowedIpsPerRuleset = 10;  // 2000 allowed addresses
-// The VM world of switch s has the id kVmWorldBase + s.
+// Virtual machine v is the world kVmWorldBase + v, named "orvm:vmNNN".
 constexpr long long kVmWorldBase = 3000000;
+
+long long PortId(int switchIndex, int port) {
+    return (switchIndex + 2) * kPortBlock + 1 + port;
+}
+
+static_assert((kSwitches + kDvSwitches + 2) * kPortBlock <= 0xffffffffLL, "port ids must fit in 32 bits");
 
 std::string Mac(int a, int b) {
     char text[18];
@@ -48,11 +70,22 @@ std::uint64_t Mix(int seed) {
     return x;
 }
 
+// Every eighth NIC has no link.
+bool HasLink(int n) {
+    return n % 8 != 7;
+}
+
+std::string VmName(int v) {
+    char name[16];
+    std::snprintf(name, sizeof name, "vm%03d", v);
+    return name;
+}
+
 // A NIC with the driver data of a real one: 10 Gb/s, fibre and copper
-// by turns, every eighth without a link, every sixteenth SR-IOV capable.
-Json Nic(int n) {
+// by turns, every sixteenth SR-IOV capable.
+Json Nic(int n, long long uplinkPortId) {
     const bool fibre = n % 2 == 0;
-    const bool link = n % 8 != 7;
+    const bool link = HasLink(n);
     Json registers = Json::array();
     for (int r = 0; r < 24; ++r) registers.push_back(Mix(n * 64 + r) & 0xffffffffULL);
     std::string eeprom;
@@ -92,7 +125,7 @@ Json Nic(int n) {
         {"wakeOn", fibre ? Json::array() : Json::array({5})},
         {"supportsMessageLevel", true},
         {"messageLevel", 7},
-        {"uplinkPortId", (n + 2) * kPortBlock + 1},
+        {"uplinkPortId", uplinkPortId},
         {"pause",
          {{"supported", true},
           {"autoNegotiate", !fibre},
@@ -203,23 +236,117 @@ Json Teaming(const Json& order) {
             {"rollingRestoration", false}, {"uplinkOrder", order}, {"maxActive", 1}};
 }
 
+// Distributed switch d: its uplinks in two LAGs (active and passive, with
+// different load balancing), one DV port per port (uplinks, then VM ports in
+// two port groups, then free ones) and the port-set ports. The LAG members
+// of a NIC without a link are down with no partner. VM port k of the
+// switches, counted over all of them, belongs to virtual machine k modulo
+// kVms, so every virtual machine has a port on a distributed switch.
+void AddDvSwitch(int d, Json& nics, Json& dvswitches, Json& dvports, Json& ports) {
+    const std::string name = "dvSwitch" + std::to_string(d);
+    const int switchIndex = kSwitches + d;
+    const std::string uplinkGroup = "dvpg-" + std::to_string(1000 + d * 10);
+    Json uplinks = Json::array(), lags = Json::array();
+    for (int lag = 0; lag < 2; ++lag) {
+        const bool active = lag == 0;
+        Json members = Json::array();
+        for (int k = lag * 2; k < lag * 2 + 2; ++k) {
+            const int n = kStandardUplinkNics + d * kDvUplinks + k;
+            const bool link = HasLink(n);
+            // Aggregatable and either in sync, collecting and distributing
+            // (0x3c) or defaulted (0x44); bit 0 marks the active mode.
+            const int localState = (active ? 1 : 0) | (link ? 0x3c : 0x44);
+            members.push_back(
+                {{"nic", "hwnic" + std::to_string(n)},
+                 {"state", link ? "Bundled" : "Down"},
+                 {"shortTimeout", false},
+                 {"local",
+                  {{"adminKey", 9 + lag},
+                   {"operKey", 9 + lag},
+                   {"portPriority", 255},
+                   {"portNumber", k + 1},
+                   {"state", localState}}},
+                 {"partner",
+                  {{"deviceId", link ? Mac(0xfe, d) : "00:00:00:00:00:00"},
+                   {"flags", link ? "SA" : ""},
+                   {"age", link ? 20 + k : 0},
+                   {"operKey", link ? 16 + lag : 0},
+                   {"portPriority", link ? 32768 : 0},
+                   {"portNumber", link ? 17 + k : 0},
+                   {"state", link ? 61 : 0}}},
+                 {"stats",
+                  {{"txLacpdus", 100000 + n}, {"rxLacpdus", link ? 99990 + n : 0}, {"txErrors", 0}, {"rxErrors", 0}}}});
+        }
+        lags.push_back({{"id", lag + 1},
+                        {"name", "lag" + std::to_string(lag + 1)},
+                        {"mode", active ? "active" : "passive"},
+                        {"loadBalance", (d * 2 + lag) % 21},
+                        {"members", members}});
+    }
+    for (int p = 0; p < kDvPorts; ++p) {
+        const std::string dvPortId = std::to_string(p);
+        Json dvport = {{"dvswitch", name}, {"id", dvPortId}};
+        Json port = {{"id", PortId(switchIndex, p)}, {"portset", name}};
+        if (p < kDvUplinks) {
+            const int n = kStandardUplinkNics + d * kDvUplinks + p;
+            const std::string nic = "hwnic" + std::to_string(n);
+            uplinks.push_back(nic);
+            nics[static_cast<std::size_t>(n)] = Nic(n, PortId(switchIndex, p));
+            dvport.update({{"portgroupId", uplinkGroup},
+                           {"connectionId", 1100000000 + switchIndex * 100 + p},
+                           {"lacpEnabled", true},
+                           {"lacpMode", p < 2 ? "active" : "passive"}});
+            port.update({{"type", "uplink"}, {"client", nic}, {"dvPortId", dvPortId}, {"teamUplink", nic}});
+        } else if (p < kDvUplinks + kDvVmPorts) {
+            const int k = d * kDvVmPorts + p - kDvUplinks;
+            const int v = k % kVms;
+            dvport.update({{"portgroupId", "dvpg-" + std::to_string(1000 + d * 10 + 1 + p % 2)},
+                           {"connectionId", 1200000000 + switchIndex * 100 + p}});
+            port.update({{"type", "vm"},
+                         {"client", VmName(v) + ".eth" + std::to_string(10 + k / kVms)},
+                         {"dvPortId", dvPortId},
+                         {"worldId", kVmWorldBase + v},
+                         {"mac", Mac(0xe0 + d, 0x8000 + p)},
+                         {"teamUplink", uplinks[static_cast<std::size_t>(p % kDvUplinks)]}});
+        } else {
+            dvport.update({{"portgroupId", "dvpg-" + std::to_string(1000 + d * 10 + 1)}, {"connectionId", 0}});
+            port["client"] = "";
+        }
+        dvports.push_back(dvport);
+        ports.push_back(port);
+    }
+    char uuid[40];
+    std::snprintf(uuid, sizeof uuid, "5a0c1d00-8e2f-4b61-a7d3-%012x", d + 1);
+    dvswitches.push_back({{"name", name},
+                          {"uuid", uuid},
+                          {"numPorts", kDvPorts},
+                          {"mtu", 9000},
+                          {"cdp", "listen"},
+                          {"beaconTimeout", -1},
+                          {"orvixBranded", true},
+                          {"uplinks", uplinks},
+                          {"lags", lags}});
+}
+
 }  // namespace
 
 int main() {
     Json profile = {{"format", "orvix-host-profile"}, {"version", 1}};
     profile["system"] = {{"hostname", "large.example.test"}, {"ipv6Enabled", true}, {"maxPorts", 4608}};
 
+    // The NICs of the standard switches; the distributed switches make theirs.
     Json nics = Json::array();
-    for (int n = 0; n < kNics; ++n) nics.push_back(Nic(n));
+    for (int n = 0; n < kNics; ++n) nics.push_back(n < kStandardUplinkNics ? Nic(n, PortId(n, 0)) : Json());
 
-    // The ports are spread over the switches: every switch gets kPorts /
-    // kSwitches of them and the first ones one more, so there are kPorts in all.
+    // The standard switches' ports are spread over them: every switch gets
+    // kStandardPorts / kSwitches of them and the first ones one more. Their
+    // VM ports are the virtual machines' in turn.
     Json vswitches = Json::array(), portgroups = Json::array(), ports = Json::array();
-    int interfaceIndex = 0;
+    int interfaceIndex = 0, vmPortIndex = 0;
     for (int s = 0; s < kSwitches; ++s) {
         const std::string name = "vSwitch" + std::to_string(s);
-        const int numPorts = kPorts / kSwitches + (s < kPorts % kSwitches ? 1 : 0);
-        const Json uplinks = s < kNics ? Json::array({"hwnic" + std::to_string(s)}) : Json::array();
+        const int numPorts = kStandardPorts / kSwitches + (s < kStandardPorts % kSwitches ? 1 : 0);
+        const Json uplinks = s < kStandardUplinkNics ? Json::array({"hwnic" + std::to_string(s)}) : Json::array();
         vswitches.push_back(
             {{"name", name},
              {"numPorts", numPorts},
@@ -237,8 +364,8 @@ int main() {
             portgroups.push_back(pg);
         }
         for (int p = 0; p < numPorts; ++p) {
-            Json port = {{"id", (s + 2) * kPortBlock + 1 + p}, {"portset", name}};
-            if (p == 0 && s < kNics) {
+            Json port = {{"id", PortId(s, p)}, {"portset", name}};
+            if (p == 0 && s < kStandardUplinkNics) {
                 port["type"] = "uplink";
                 port["client"] = "hwnic" + std::to_string(s);
             } else if (p == 1 && interfaceIndex < kInterfaces) {
@@ -246,9 +373,11 @@ int main() {
                 port["client"] = "pld" + std::to_string(interfaceIndex++);
                 port["portgroup"] = name + "-pg0";
             } else if (p % 2 == 0) {
+                const int v = vmPortIndex % kVms;
                 port["type"] = "vm";
-                port["client"] = "vm" + std::to_string(s) + ".eth" + std::to_string(p);
+                port["client"] = VmName(v) + ".eth" + std::to_string(vmPortIndex++ / kVms);
                 port["portgroup"] = name + "-pg1";
+                port["worldId"] = kVmWorldBase + v;
                 port["mac"] = Mac(s, p);
             } else {
                 port["client"] = "";
@@ -256,6 +385,9 @@ int main() {
             ports.push_back(port);
         }
     }
+
+    Json dvswitches = Json::array(), dvports = Json::array();
+    for (int d = 0; d < kDvSwitches; ++d) AddDvSwitch(d, nics, dvswitches, dvports, ports);
 
     // The interfaces take the netstacks in turn, pld0 (which the routes use)
     // the default one, and each has a static address; every fourth netstack
@@ -275,7 +407,7 @@ int main() {
                               {"mac", Mac(0xb0, i)},
                               {"mtu", 1500},
                               {"enabled", true},
-                              {"portId", (i + 2) * kPortBlock + 2},
+                              {"portId", PortId(i, 1)},
                               {"portgroup", sw + "-pg0"}});
     }
 
@@ -367,19 +499,15 @@ int main() {
         connections.push_back(connection);
     }
 
-    // Virtual machines: the VM ports of each switch are used by one VM world
-    // of that switch, so the VM commands group ports on every switch.
-    for (Json& port : ports) {
-        if (port.value("type", "") != "vm") continue;
-        port["worldId"] = kVmWorldBase + port["id"].get<long long>() / kPortBlock - 2;
-    }
-    for (int s = 0; s < kSwitches; ++s) {
-        worlds.push_back({{"id", kVmWorldBase + s}, {"name", "orvm:vm" + std::to_string(s)}, {"kind", "vm"}});
+    for (int v = 0; v < kVms; ++v) {
+        worlds.push_back({{"id", kVmWorldBase + v}, {"name", "orvm:" + VmName(v)}, {"kind", "vm"}});
     }
 
     profile["nics"] = nics;
     profile["vswitches"] = vswitches;
     profile["portgroups"] = portgroups;
+    profile["dvswitches"] = dvswitches;
+    profile["dvports"] = dvports;
     profile["netstacks"] = netstacks;
     profile["interfaces"] = interfaces;
     profile["routes"] = routes;

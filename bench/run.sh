@@ -2,11 +2,11 @@
 # Times orvixcli commands as whole processes beside a baseline process (one
 # that starts, dlopens one shared library and calls one function), measured in
 # the same run and interleaved with it. Prints medians and their ratios to the
-# baseline, on the default host and on a large one (about 1000 standard
-# switches, 4096 ports, 2000 port groups, 64 NICs, 256 interfaces on 16
-# netstacks, 10000 routes, 2000 neighbors, 5000 connections; made by
-# orvix-bench-make-profile). Run it through `./dev bench` so that everything is
-# built.
+# baseline, on the default host and on a large one (1000 standard and 8
+# distributed switches, 4096 ports, 2000 port groups, 64 NICs, 256 interfaces
+# on 16 netstacks, 10000 routes, 2000 neighbors, 5000 connections, 500 VMs;
+# made by orvix-bench-make-profile). Run it through `./dev bench` so that
+# everything is built.
 #
 #   bench/run.sh [RUNS]        (default 200 runs per command)
 set -euo pipefail
@@ -80,7 +80,7 @@ export ORVIX_HOST_DB=$work/large.db
 "$bin/orvix-bench-make-profile" >"$work/large.json"
 "$bin/orvix-hostsim" init --profile "$work/large.json" >/dev/null
 echo
-echo "Large host: 1000 switches, 4096 ports, 2000 port groups, 64 NICs, 256 interfaces, 16 netstacks, 10000 routes, 2000 neighbors, 5000 connections, 200 firewall rulesets with 5000 rules ($runs runs each):"
+echo "Large host: 1000 standard and 8 distributed switches, 4096 ports, 500 VMs, 2000 port groups, 64 NICs, 256 interfaces, 16 netstacks, 10000 routes, 2000 neighbors, 5000 connections, 200 firewall rulesets with 5000 rules ($runs runs each):"
 "$bin/orvix-bench-timer" "$runs" \
     "baseline (dlopen + one call)" "$bin/orvix-bench-baseline" \
     "network ip get" "$cli network ip get" \
@@ -114,9 +114,10 @@ echo "Large host: 1000 switches, 4096 ports, 2000 port groups, 64 NICs, 256 inte
 
 # Ports, VMs and distributed switches: the single-port command looks its port
 # up directly, so it should cost the same on both hosts; the listings walk
-# every port once. The large host's ports of the first 254 switches have ids
-# within 32 bits; 200 * 2^24 + 33554433 is the first port of vSwitch200, a VM
-# port of world 3000200.
+# every port once. On the large host switch n (the 1000 standard ones, then
+# dvSwitch0 to dvSwitch7) has the port ids from (n + 2) * 2^16 + 1 on: the
+# port timed is DV port 40 of dvSwitch7, a VM port; world 3000200 (vm200) has
+# ports on four standard switches and on dvSwitch3.
 export ORVIX_HOST_DB=$work/default.db
 echo
 echo "Ports, VMs and distributed switches, default host ($runs runs each):"
@@ -128,12 +129,12 @@ echo "Ports, VMs and distributed switches, default host ($runs runs each):"
     "network vswitch dvs orvix list" "$cli network vswitch dvs orvix list"
 export ORVIX_HOST_DB=$work/large.db
 echo
-echo "Ports, VMs and distributed switches, large host ($runs runs each):"
+echo "Ports, VMs and distributed switches, large host: 8 distributed switches, 500 VMs, 4096 ports ($runs runs each):"
 "$bin/orvix-bench-timer" "$runs" \
     "baseline (dlopen + one call)" "$bin/orvix-bench-baseline" \
     "network vm list" "$cli network vm list" \
     "network vm port list" "$cli network vm port list -w 3000200" \
-    "network port stats get" "$cli network port stats get -p $((200 * 16777216 + 33554433))" \
+    "network port stats get" "$cli network port stats get -p $(((1000 + 7 + 2) * 65536 + 41))" \
     "network vswitch dvs orvix list" "$cli network vswitch dvs orvix list"
 echo
 bench/batch.sh

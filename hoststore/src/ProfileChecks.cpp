@@ -223,9 +223,9 @@ const FieldChecks kFilter = {
     Integer("packetErrors", 0, kUint64Max),
 };
 const FieldChecks kPort = {
-    // Port ids pass 32 bits on a host of many switches, whose id blocks
-    // start at (n + 2) * 2^24.
-    Integer("id", 0, kInt64Max),
+    // The library hands port ids out as unsigned 32-bit numbers, so a larger
+    // id could never be asked for and would read as another port's.
+    Integer("id", 0, kUint32Max),
     Text("portset"),
     Word("type", {"vm", "kernel", "uplink", "internal"}),
     Text("client"),
@@ -330,7 +330,7 @@ const FieldChecks kNic = {
     Integers("wakeOn", 0, kInt32Max),
     Flag("supportsMessageLevel"),
     Integer("messageLevel", 0, kUint32Max),
-    Integer("uplinkPortId", 0, kInt64Max),
+    Integer("uplinkPortId", 0, kUint32Max),
     Nested("pause", kPause),
     Nested("coalesce", kCoalesce),
     Nested("rings", kRings),
@@ -404,7 +404,7 @@ const FieldChecks kInterface = {
     Text("opaqueNetworkType"),
     Text("externalId"),
     Text("opaqueSwitch"),
-    Integer("portId", 0, kInt64Max),
+    Integer("portId", 0, kUint32Max),
     Text("mac"),
     Integer("mtu", 1280, 9000),
     Integer("tsoMss", 0, kInt32Max),

@@ -105,7 +105,7 @@ TEST(ProfileTest, FieldsTheLibraryReadsKeepTheirTypeAndRange) {
     EXPECT_EQ(ErrorOf(WithSections(R"("ports": [{"id": 1, "portset": "a", "type": "nic"}])")),
               "profile t.json: ports[0].type: must be one of vm, kernel, uplink, internal, not 'nic'");
     EXPECT_EQ(ErrorOf(WithSections(R"("nics": [{"name": "hwnic0", "uplinkPortId": -1}])")),
-              "profile t.json: nics[0].uplinkPortId: must be an integer from 0 to 9223372036854775807, not -1");
+              "profile t.json: nics[0].uplinkPortId: must be an integer from 0 to 4294967295, not -1");
     // Policies and other nested objects are checked field by field.
     EXPECT_EQ(ErrorOf(WithSections(R"("vswitches": [{"name": "a"}],
                                       "portgroups": [{"name": "p", "vswitch": "a",
@@ -127,7 +127,7 @@ TEST(ProfileTest, FieldsTheLibraryReadsKeepTheirTypeAndRange) {
                                       "vswitches": [{"name": "a", "numPorts": 4096, "mtu": 9000.0, "owner": 7,
                                                      "shaping": {"averageBps": 18446744073709551615}}],
                                       "portgroups": [{"name": "p", "vswitch": "a", "vlanId": 4095}],
-                                      "ports": [{"id": 9223372036854775807, "portset": "a", "type": "uplink"}])")),
+                                      "ports": [{"id": 4294967295, "portset": "a", "type": "uplink"}])")),
               "(accepted)");
 }
 
@@ -233,6 +233,29 @@ TEST(ProfileTest, AddressesRoutesAndIpsecFieldsAreCheckedAsTheLibraryCompares) {
               "profile t.json: ipsecSPs[0].direction: must be one of in, out, not 'both'");
     EXPECT_EQ(ErrorOf(WithSections(R"("ipsec": {"ikeDaemonsRunning": "yes"})")),
               "profile t.json: ipsec.ikeDaemonsRunning: must be true or false, not string");
+}
+
+// Port ids are unsigned 32-bit numbers wherever a profile names one: a port's
+// own id, a NIC's uplink port and an interface's port. One past the largest
+// would otherwise be stored and later read as a different port's id.
+TEST(ProfileTest, PortIdsFitInThirtyTwoBits) {
+    EXPECT_EQ(ErrorOf(WithSections(R"("vswitches": [{"name": "a"}],
+                                      "ports": [{"id": 4294967296, "portset": "a", "client": ""}])")),
+              "profile t.json: ports[0].id: must be an integer from 0 to 4294967295, not 4294967296");
+    EXPECT_EQ(ErrorOf(WithSections(R"("ports": [{"id": 1, "portset": "a"}, {"id": -1, "portset": "a"}])")),
+              "profile t.json: ports[1].id: must be an integer from 0 to 4294967295, not -1");
+    EXPECT_EQ(ErrorOf(WithSections(R"("nics": [{"name": "hwnic0", "uplinkPortId": 4311744513}])")),
+              "profile t.json: nics[0].uplinkPortId: must be an integer from 0 to 4294967295, not 4311744513");
+    EXPECT_EQ(ErrorOf(WithSections(R"("netstacks": [{"key": "s"}],
+                                      "interfaces": [{"name": "pld0", "netstack": "s", "portId": 4294967296}])")),
+              "profile t.json: interfaces[0].portId: must be an integer from 0 to 4294967295, not 4294967296");
+    EXPECT_EQ(ErrorOf(WithSections(R"("netstacks": [{"key": "s"}],
+                                      "nics": [{"name": "hwnic0", "uplinkPortId": 4294967295}],
+                                      "interfaces": [{"name": "pld0", "netstack": "s", "portId": 4294967294}],
+                                      "vswitches": [{"name": "a"}],
+                                      "ports": [{"id": 4294967295, "portset": "a", "client": "hwnic0"},
+                                                {"id": 4294967294, "portset": "a", "client": "pld0"}])")),
+              "(accepted)");
 }
 
 TEST(ProfileTest, NumbersBeyondTheParserAreRefusedWithTheirPlace) {

@@ -23,8 +23,8 @@ TEST_F(Interfaces, AddOnAPortGroupTakesAPortAndRemoveGivesItBack) {
     EXPECT_EQ(nic->GetName(), "pld3");
     EXPECT_EQ(nic->GetMacAddress().GetStringAddress(), "02:a1:01:00:00:04");
     EXPECT_EQ(nic->GetMtu(), 1500);
-    EXPECT_EQ(nic->GetPortId(), 33554442);
-    EXPECT_EQ(Stored("ports", "id", 33554442), (Json{{"id", 33554442},
+    EXPECT_EQ(nic->GetPortId(), 33554443);
+    EXPECT_EQ(Stored("ports", "id", 33554443), (Json{{"id", 33554443},
                                                      {"portset", "vSwitch0"},
                                                      {"type", "kernel"},
                                                      {"client", "pld3"},
@@ -43,11 +43,11 @@ TEST_F(Interfaces, AddOnAPortGroupTakesAPortAndRemoveGivesItBack) {
     EXPECT_EQ(point->GetType(), ConnectionPoint::TYPE_PORT_GROUP);
     EXPECT_EQ(point->GetPortGroupName(), "VM Network");
     EXPECT_EQ(point->GetPortsetName(), "vSwitch0");
-    EXPECT_EQ(NetworkFactory::GetPortGroupByName("VM Network")->GetVirtualSwitch()->GetNumUsedPorts(), 8);
+    EXPECT_EQ(NetworkFactory::GetPortGroupByName("VM Network")->GetVirtualSwitch()->GetNumUsedPorts(), 9);
 
     nic->Remove();
     EXPECT_TRUE(Stored("interfaces", "name", "pld3").is_null());
-    EXPECT_TRUE(Stored("ports", "id", 33554442).is_null());
+    EXPECT_TRUE(Stored("ports", "id", 33554443).is_null());
     EXPECT_EQ(MessageOf([&] { nic->Remove(); }), "Interface pld3 does not exist");
 }
 
@@ -64,7 +64,7 @@ TEST_F(Interfaces, AddOnADvPortRecordsTheConnectionAndRemoveByPointFreesThePort)
     const Json port = Stored("ports", "client", "pld7");
     EXPECT_EQ(port["portset"], "dvSwitch0");
     EXPECT_EQ(port["dvPortId"], "11");
-    EXPECT_EQ(port["id"], 67108871);
+    EXPECT_EQ(port["id"], 67108874);
     EXPECT_FALSE(port.contains("portgroup"));
     EXPECT_EQ(Stored("interfaces", "name", "pld7")["mtu"], 9000);
 

@@ -59,8 +59,8 @@ TEST_F(Pnics, AdminDownHidesTheLinkAndUpRestoresIt) {
 
 TEST_F(Pnics, SnapshotsKeepWhatTheyReadAndNamedObjectsReadOnFirstUse) {
     auto listed = NetworkInfoImpl().GetPnics();
-    ASSERT_EQ(listed.size(), 7u);
-    EXPECT_EQ(listed[6]->GetName(), "hwnic6");
+    ASSERT_EQ(listed.size(), 8u);
+    EXPECT_EQ(listed[7]->GetName(), "hwnic7");
     PnicImpl named("hwnic1");  // nothing read yet
     Nic("hwnic1")->SetLinkSpeedDuplex(100, DUPLEX_HALF);
     // The listing's snapshot is as it was; the named object reads now.

@@ -66,6 +66,15 @@ $ orvixcli network nic coalesce get --formatter=simple
    Adaptive TX: N/A
    Sample interval seconds: N/A
 
+   NIC: hwnic7
+   RX microseconds: 50
+   RX maximum frames: 64
+   TX microseconds: 50
+   TX Maximum frames: 64
+   Adaptive RX: On
+   Adaptive TX: On
+   Sample interval seconds: 2
+
 ## A set reads the record first; when that fails nothing is written.
 $ orvixcli network nic coalesce set -n hwnic3 -r 1
 ! Driver of hwnic3 timed out

@@ -11,6 +11,7 @@ hwnic3  50               64                 50               64                 
 hwnic4  8                128                16               128                On           Off          1
 hwnic5  0                1                  0                1                  Off          Off          0
 hwnic6  N/A              N/A                N/A              N/A                N/A          N/A          N/A
+hwnic7  50               64                 50               64                 On           On           2
 
 $ orvixcli network nic coalesce get -n hwnic4 --formatter=simple
    NIC: hwnic4
@@ -100,6 +101,7 @@ hwnic3  50               64                 50               64                 
 hwnic4  8                128                16               128                On           Off          1
 hwnic5  0                0                  7                1                  On           Off          0
 hwnic6  N/A              N/A                N/A              N/A                N/A          N/A          N/A
+hwnic7  50               64                 50               64                 On           On           2
 
 $ orvixcli network nic coalesce set -n hwnic9 -r 1
 ! Pnic with name hwnic9 not found

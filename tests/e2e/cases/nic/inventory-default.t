@@ -9,6 +9,7 @@ hwnic3  0000:04:00.1  cvx10    Up            Up           10000  Full    02:a1:0
 hwnic4  0000:06:00.0  fwk25    Up            Up           25000  Full    02:a1:00:00:00:05  9000  Fenwick Fabric Systems FW-25E 25GbE SR-IOV Network Controller
 hwnic5  0000:08:00.0  lrk1g    Up            Down         0      Half    02:a1:00:00:00:06  1500  Larkspur Networks Inc. LN105 Gigabit Ethernet Controller
 hwnic6  Pseudo        vpseudo  Down          Down         0      Full    02:a1:00:00:00:07  9000  Unknown Unknown
+hwnic7  0000:0a:00.0  cvx10    Up            Up           10000  Full    02:a1:00:00:00:08  9000  Corvid Optics Ltd. CV-10SX 10-Gigabit SFP+ Network Adapter
 
 $ orvixcli network nic get -n hwnic2
    Name: hwnic2

@@ -40,6 +40,9 @@ $ orvixcli network nic sg get --formatter=simple
    NIC: hwnic6
    Value: N/A
 
+   NIC: hwnic7
+   Value: on
+
 ## A set reads the current record first: when that fails nothing is sent.
 $ orvixcli network nic cso set -n hwnic1 -e 0
 ! Driver of hwnic1 timed out

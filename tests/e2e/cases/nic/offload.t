@@ -12,6 +12,7 @@ hwnic3  on                   on
 hwnic4  on                   on
 hwnic5  on                   off
 hwnic6  N/A                  N/A
+hwnic7  on                   on
 
 $ orvixcli network nic tso get
 NIC     Value
@@ -23,6 +24,7 @@ hwnic3  off
 hwnic4  on
 hwnic5  off
 hwnic6  N/A
+hwnic7  on
 
 $ orvixcli network nic sg get
 NIC     Value
@@ -34,6 +36,7 @@ hwnic3  on
 hwnic4  on
 hwnic5  off
 hwnic6  N/A
+hwnic7  on
 
 ## One NIC, in the other formatters.
 $ orvixcli network nic cso get --hwnic=hwnic5 --formatter=json
@@ -118,6 +121,9 @@ $ orvixcli network nic tso get --formatter=simple
    NIC: hwnic6
    Value: N/A
 
+   NIC: hwnic7
+   Value: on
+
 $ orvixcli network nic sg get
 NIC     Value
 ------  -----
@@ -128,6 +134,7 @@ hwnic3  on
 hwnic4  on
 hwnic5  off
 hwnic6  N/A
+hwnic7  on
 
 $ orvixcli network nic cso get
 NIC     RX Checksum Offload  TX Checksum Offload
@@ -139,6 +146,7 @@ hwnic3  on                   on
 hwnic4  on                   on
 hwnic5  on                   on
 hwnic6  N/A                  N/A
+hwnic7  on                   on
 
 ## The enable value is 0 or 1, and both options are required.
 $ orvixcli network nic tso set -n hwnic0 -e 2

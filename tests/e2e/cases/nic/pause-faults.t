@@ -13,6 +13,7 @@ hwnic3  true                    false     false     false             false     
 hwnic4  true                    true      true      true              true                               true                            true
 hwnic5  false                   false     false     false             false                              false                           false
 hwnic6  false                   false     false     false             false                              false                           false
+hwnic7  true                    false     false     false             false                              false                           false
 
 $ orvixcli network nic pauseParams set -n hwnic0 -r false
 ! Driver of hwnic0 timed out

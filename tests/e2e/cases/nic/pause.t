@@ -12,6 +12,7 @@ hwnic3  true                    false     false     false             false     
 hwnic4  true                    true      true      true              true                               true                            true
 hwnic5  false                   false     false     false             false                              false                           false
 hwnic6  false                   false     false     false             false                              false                           false
+hwnic7  true                    false     false     false             false                              false                           false
 
 $ orvixcli network nic pauseParams list -n hwnic1 --formatter=json
 [
@@ -112,6 +113,16 @@ $ orvixcli network nic pauseParams list --formatter=json
   {
     "NIC": "hwnic6",
     "Pause Params Supported": false,
+    "Pause RX": false,
+    "Pause TX": false,
+    "Auto Negotiation": false,
+    "Auto Negotiation Resolution Avail": false,
+    "RX Auto Negotiation Resolution": false,
+    "TX Auto Negotiation Resolution": false
+  },
+  {
+    "NIC": "hwnic7",
+    "Pause Params Supported": true,
     "Pause RX": false,
     "Pause TX": false,
     "Auto Negotiation": false,

@@ -13,6 +13,7 @@ hwnic3  off       on        off             off                   off          o
 hwnic4  off       off       off             off                   off          off             off       off           off       off           off       off                off           off
 hwnic5  on        on        on              off                   off          on              on        off           on        off           off       off                on            off
 hwnic6  off       off       off             off                   off          off             off       off           off       off           off       off                off           off
+hwnic7  off       off       off             off                   off          on              off       off           off       off           off       off                off           off
 
 $ orvix-hostsim fault add NetworkInfoImpl::GetPnics --message "Unable to list the NICs: store busy" --count 1
 2
@@ -42,3 +43,4 @@ hwnic3  off       on        off             off                   off          o
 hwnic4  off       off       off             off                   off          off             off       off           off       off           off       off                off           off
 hwnic5  on        on        on              off                   off          on              on        off           on        off           off       off                on            off
 hwnic6  off       off       off             off                   off          off             off       off           off       off           off       off                off           off
+hwnic7  off       off       off             off                   off          on              off       off           off       off           off       off                off           off

@@ -11,6 +11,7 @@ hwnic3  off       on        off             off                   off          o
 hwnic4  off       off       off             off                   off          off             off       off           off       off           off       off                off           off
 hwnic5  on        on        on              off                   off          on              on        off           on        off           off       off                on            off
 hwnic6  off       off       off             off                   off          off             off       off           off       off           off       off                off           off
+hwnic7  off       off       off             off                   off          on              off       off           off       off           off       off                off           off
 
 $ orvixcli network nic software list --formatter=json
 [
@@ -124,6 +125,23 @@ $ orvixcli network nic software list --formatter=json
     "Offset Based Offload": "off",
     "VXLAN Encap": "off",
     "Geneve Offload": "off",
+    "IPv6 TSO": "off",
+    "IPv6 TSO Ext": "off",
+    "IPv6 CSO": "off",
+    "IPv6 CSO Ext": "off",
+    "High DMA": "off",
+    "Scatter Gather MP": "off",
+    "VLAN Tagging": "off",
+    "VLAN Untagging": "off"
+  },
+  {
+    "NIC": "hwnic7",
+    "IPv4 CSO": "off",
+    "IPv4 TSO": "off",
+    "Scatter Gather": "off",
+    "Offset Based Offload": "off",
+    "VXLAN Encap": "off",
+    "Geneve Offload": "on",
     "IPv6 TSO": "off",
     "IPv6 TSO Ext": "off",
     "IPv6 CSO": "off",
@@ -254,6 +272,22 @@ $ orvixcli network nic software list --formatter=simple
    VLAN Tagging: off
    VLAN Untagging: off
 
+   NIC: hwnic7
+   IPv4 CSO: off
+   IPv4 TSO: off
+   Scatter Gather: off
+   Offset Based Offload: off
+   VXLAN Encap: off
+   Geneve Offload: on
+   IPv6 TSO: off
+   IPv6 TSO Ext: off
+   IPv6 CSO: off
+   IPv6 CSO Ext: off
+   High DMA: off
+   Scatter Gather MP: off
+   VLAN Tagging: off
+   VLAN Untagging: off
+
 ## Several options at once: each given feature is set, the others keep
 ## their value.
 $ orvixcli network nic software set --hwnic=hwnic5 --ipv4cso=false --sgsp=true --tagging no --obo yes --formatter=json
@@ -370,6 +404,23 @@ $ orvixcli network nic software list --formatter=json
     "Offset Based Offload": "off",
     "VXLAN Encap": "off",
     "Geneve Offload": "off",
+    "IPv6 TSO": "off",
+    "IPv6 TSO Ext": "off",
+    "IPv6 CSO": "off",
+    "IPv6 CSO Ext": "off",
+    "High DMA": "off",
+    "Scatter Gather MP": "off",
+    "VLAN Tagging": "off",
+    "VLAN Untagging": "off"
+  },
+  {
+    "NIC": "hwnic7",
+    "IPv4 CSO": "off",
+    "IPv4 TSO": "off",
+    "Scatter Gather": "off",
+    "Offset Based Offload": "off",
+    "VXLAN Encap": "off",
+    "Geneve Offload": "on",
     "IPv6 TSO": "off",
     "IPv6 TSO Ext": "off",
     "IPv6 CSO": "off",

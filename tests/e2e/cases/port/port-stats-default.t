@@ -44,3 +44,57 @@ Filter statistics for vm-firewall
    Packets queued: 2200
    Packets injected: 990
    Packet errors: 0
+## lab01's port counts round numbers: 1000000 - 2500 - 1500 = 996000 unicast
+## packets received, 800000 - 400 - 600 = 799000 sent.
+$ orvixcli network port stats get -p 67108873
+Packet statistics for port 67108873
+   Packets received: 1000000
+   Packets sent: 800000
+   Bytes received: 640000000
+   Bytes sent: 512000000
+   Broadcast packets received: 2500
+   Broadcast packets sent: 400
+   Multicast packets received: 1500
+   Multicast packets sent: 600
+   Unicast packets received: 996000
+   Unicast packets sent: 799000
+   Receive packets dropped: 0
+   Transmit packets dropped: 0
+## hwnic7's uplink port on the distributed switch, which has no filters.
+$ orvixcli network port stats get -p 67108871 --formatter=json
+[
+  {
+    "Packets received": 120400000,
+    "Packets sent": 98700000,
+    "Bytes received": 89096000000,
+    "Bytes sent": 64155000000,
+    "Broadcast packets received": 400000,
+    "Broadcast packets sent": 700,
+    "Multicast packets received": 200000,
+    "Multicast packets sent": 300,
+    "Unicast packets received": 119800000,
+    "Unicast packets sent": 98699000,
+    "Receive packets dropped": 1200,
+    "Transmit packets dropped": 0,
+    "Port ID": 67108871
+  }
+]
+$ orvixcli network port filter stats get -p 67108871
+## app01's DV port: an extended receive filter and a plain transmit one.
+$ orvixcli network port filter stats get -p 67108872
+Filter statistics for vm-firewall
+   Filter direction: Receive
+   Packets in: 2500000
+   Packets out: 2493750
+   Packets dropped: 6250
+   Packets filtered: 50000
+   Packets faulted: 0
+   Packets queued: 250
+   Packets injected: 100
+   Packet errors: 0
+
+Filter statistics for packet-capture
+   Filter direction: Transmit
+   Packets in: 1800000
+   Packets out: 1800000
+   Packets dropped: 0

@@ -1,10 +1,12 @@
-## The default host's three virtual machines.
+## The default host's five virtual machines.
 $ orvixcli network vm list
 World ID  Name     Num Ports  Networks
 --------  -------  ---------  -------------------
 1049601   web01    2          VM Network, dvpg-31
 1049777   db01     2          VM Network, Storage
 1050310   build01  1          dvpg-31
+1050512   app01    2          Storage, dvpg-31
+1051022   lab01    1          dvpg-31
 $ orvixcli network vm port list -w 1049601
    Port ID: 33554438
    vSwitch: vSwitch0
@@ -42,3 +44,36 @@ $ orvixcli network vm port list -w 1050310 --formatter=json
     ]
   }
 ]
+## lab01's one port on the distributed switch leaves by no uplink now: no team
+## uplink (its port id -1), and the VM's address is not known.
+$ orvixcli network vm port list -w 1051022
+   Port ID: 67108873
+   vSwitch: dvSwitch0
+   Portgroup: dvpg-31
+   DVPort ID: 24
+   MAC Address: 02:a1:02:00:00:08
+   IP Address: 0.0.0.0
+   Team Uplink: 
+   Uplink Port ID: -1
+   Active Filters: 
+## app01 has a port on each kind of switch; the one on Storage is VLAN-tagged.
+$ orvixcli network vm port list -w 1050512
+   Port ID: 33554442
+   vSwitch: vSwitch0
+   Portgroup: Storage
+   DVPort ID: 
+   MAC Address: 02:a1:02:00:00:07
+   IP Address: 198.51.100.160
+   Team Uplink: hwnic0
+   Uplink Port ID: 33554433
+   Active Filters: 
+
+   Port ID: 67108872
+   vSwitch: dvSwitch0
+   Portgroup: dvpg-31
+   DVPort ID: 23
+   MAC Address: 02:a1:02:00:00:06
+   IP Address: 192.0.2.160
+   Team Uplink: hwnic3
+   Uplink Port ID: 67108866
+   Active Filters: vm-firewall, packet-capture

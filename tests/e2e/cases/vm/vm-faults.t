@@ -34,8 +34,12 @@ World ID  Name     Num Ports  Networks
 1049601   web01    2          VM Network, dvpg-31
 1049777   db01     2          VM Network, Storage
 1050310   build01  1          dvpg-31
+1050512   app01    2          Storage, dvpg-31
+1051022   lab01    1          dvpg-31
 $ orvixcli network vm list --formatter=csv
 World ID,Name,Num Ports,Networks
 1049601,web01,2,"VM Network,dvpg-31"
 1049777,db01,2,"VM Network,Storage"
 1050310,build01,1,dvpg-31
+1050512,app01,2,"Storage,dvpg-31"
+1051022,lab01,1,dvpg-31

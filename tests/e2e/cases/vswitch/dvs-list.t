@@ -6,12 +6,12 @@ dvSwitch0
    VDS ID: 6f3c2a10-4b7e-4d21-9c5a-0e8d7f61b2a4
    Class: dvswitch
    Num Ports: 512
-   Used Ports: 6
-   Configured Ports: 6
+   Used Ports: 9
+   Configured Ports: 9
    MTU: 9000
    CDP Status: listen
    Beacon Timeout: -1
-   Uplinks: hwnic2, hwnic3, hwnic5
+   Uplinks: hwnic2, hwnic3, hwnic5, hwnic7
    Orvix Branded: true
    DVPort:
       Port ID: 0
@@ -28,6 +28,11 @@ dvSwitch0
       In Use: true
       DVPortgroup ID: dvpg-30
       Client: hwnic5
+
+      Port ID: 3
+      In Use: true
+      DVPortgroup ID: dvpg-30
+      Client: hwnic7
 
       Port ID: 10
       In Use: true
@@ -53,6 +58,16 @@ dvSwitch0
       In Use: false
       DVPortgroup ID: dvpg-31
       Client: 
+
+      Port ID: 23
+      In Use: true
+      DVPortgroup ID: dvpg-31
+      Client: app01.eth0
+
+      Port ID: 24
+      In Use: true
+      DVPortgroup ID: dvpg-31
+      Client: lab01.eth0
 $ orvixcli network vswitch dvs orvix list --formatter=json
 [
   {
@@ -60,15 +75,16 @@ $ orvixcli network vswitch dvs orvix list --formatter=json
     "VDS ID": "6f3c2a10-4b7e-4d21-9c5a-0e8d7f61b2a4",
     "Class": "dvswitch",
     "Num Ports": 512,
-    "Used Ports": 6,
-    "Configured Ports": 6,
+    "Used Ports": 9,
+    "Configured Ports": 9,
     "MTU": 9000,
     "CDP Status": "listen",
     "Beacon Timeout": -1,
     "Uplinks": [
       "hwnic2",
       "hwnic3",
-      "hwnic5"
+      "hwnic5",
+      "hwnic7"
     ],
     "Orvix Branded": true,
     "DVPort": [
@@ -94,6 +110,14 @@ $ orvixcli network vswitch dvs orvix list --formatter=json
         "DVPortgroup ID": "dvpg-30",
         "Client": [
           "hwnic5"
+        ]
+      },
+      {
+        "Port ID": "3",
+        "In Use": true,
+        "DVPortgroup ID": "dvpg-30",
+        "Client": [
+          "hwnic7"
         ]
       },
       {
@@ -131,6 +155,22 @@ $ orvixcli network vswitch dvs orvix list --formatter=json
         "In Use": false,
         "DVPortgroup ID": "dvpg-31",
         "Client": []
+      },
+      {
+        "Port ID": "23",
+        "In Use": true,
+        "DVPortgroup ID": "dvpg-31",
+        "Client": [
+          "app01.eth0"
+        ]
+      },
+      {
+        "Port ID": "24",
+        "In Use": true,
+        "DVPortgroup ID": "dvpg-31",
+        "Client": [
+          "lab01.eth0"
+        ]
       }
     ]
   }
@@ -138,9 +178,9 @@ $ orvixcli network vswitch dvs orvix list --formatter=json
 ## One switch by name; a name no switch has ends the walk at once: the error
 ## and an empty list.
 $ orvixcli network vswitch dvs orvix list -v dvSwitch0 --formatter=table
-Name       VDS ID                                Class     Num Ports  Used Ports  Configured Ports  MTU   CDP Status  Beacon Timeout  Uplinks                 Orvix Branded  DVPort
----------  ------------------------------------  --------  ---------  ----------  ----------------  ----  ----------  --------------  ----------------------  -------------  -------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------
-dvSwitch0  6f3c2a10-4b7e-4d21-9c5a-0e8d7f61b2a4  dvswitch  512        6           6                 9000  listen      -1              hwnic2, hwnic3, hwnic5  true           {Port ID: 0, In Use: true, DVPortgroup ID: dvpg-30, Client: hwnic2}, {Port ID: 1, In Use: true, DVPortgroup ID: dvpg-30, Client: hwnic3}, {Port ID: 2, In Use: true, DVPortgroup ID: dvpg-30, Client: hwnic5}, {Port ID: 10, In Use: true, DVPortgroup ID: dvpg-32, Client: pld1}, {Port ID: 11, In Use: false, DVPortgroup ID: dvpg-32, Client: }, {Port ID: 20, In Use: true, DVPortgroup ID: dvpg-31, Client: build01.eth0}, {Port ID: 21, In Use: true, DVPortgroup ID: dvpg-31, Client: web01.eth1}, {Port ID: 22, In Use: false, DVPortgroup ID: dvpg-31, Client: }
+Name       VDS ID                                Class     Num Ports  Used Ports  Configured Ports  MTU   CDP Status  Beacon Timeout  Uplinks                         Orvix Branded  DVPort
+---------  ------------------------------------  --------  ---------  ----------  ----------------  ----  ----------  --------------  ------------------------------  -------------  --------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------------
+dvSwitch0  6f3c2a10-4b7e-4d21-9c5a-0e8d7f61b2a4  dvswitch  512        9           9                 9000  listen      -1              hwnic2, hwnic3, hwnic5, hwnic7  true           {Port ID: 0, In Use: true, DVPortgroup ID: dvpg-30, Client: hwnic2}, {Port ID: 1, In Use: true, DVPortgroup ID: dvpg-30, Client: hwnic3}, {Port ID: 2, In Use: true, DVPortgroup ID: dvpg-30, Client: hwnic5}, {Port ID: 3, In Use: true, DVPortgroup ID: dvpg-30, Client: hwnic7}, {Port ID: 10, In Use: true, DVPortgroup ID: dvpg-32, Client: pld1}, {Port ID: 11, In Use: false, DVPortgroup ID: dvpg-32, Client: }, {Port ID: 20, In Use: true, DVPortgroup ID: dvpg-31, Client: build01.eth0}, {Port ID: 21, In Use: true, DVPortgroup ID: dvpg-31, Client: web01.eth1}, {Port ID: 22, In Use: false, DVPortgroup ID: dvpg-31, Client: }, {Port ID: 23, In Use: true, DVPortgroup ID: dvpg-31, Client: app01.eth0}, {Port ID: 24, In Use: true, DVPortgroup ID: dvpg-31, Client: lab01.eth0}
 $ orvixcli network vswitch dvs orvix list --vds-name=nosuch
 ! Unable to access all vDS
 [1]

@@ -11,7 +11,7 @@ Name                Virtual Switch  Active Clients  VLAN ID
 ------------------  --------------  --------------  -------
 Management Network  vSwitch0        1               0
 VM Network          vSwitch0        2               0
-Storage             vSwitch0        1               20
+Storage             vSwitch0        2               20
 Migration           vSwitch0        1               30
 Lab Isolated        vSwitch1        0               100
 Backup Net          vSwitch1        0               0
@@ -89,7 +89,7 @@ Name                Virtual Switch  Active Clients  VLAN ID
 ------------------  --------------  --------------  -------
 Management Network  vSwitch0        1               0
 VM Network          vSwitch0        2               0
-Storage             vSwitch0        1               20
+Storage             vSwitch0        2               20
 Migration           vSwitch0        1               30
 Backup Net          vSwitch1        0               0
 

@@ -5,7 +5,7 @@ Name                Virtual Switch  Active Clients  VLAN ID
 ------------------  --------------  --------------  -------
 Management Network  vSwitch0        1               0
 VM Network          vSwitch0        2               0
-Storage             vSwitch0        1               20
+Storage             vSwitch0        2               20
 Migration           vSwitch0        1               30
 Lab Isolated        vSwitch1        0               100
 
@@ -22,7 +22,7 @@ $ orvixcli network vswitch standard portgroup list --formatter=simple
 
    Name: Storage
    Virtual Switch: vSwitch0
-   Active Clients: 1
+   Active Clients: 2
    VLAN ID: 20
 
    Name: Migration
@@ -52,7 +52,7 @@ $ orvixcli network vswitch standard portgroup list --formatter=json
   {
     "Name": "Storage",
     "Virtual Switch": "vSwitch0",
-    "Active Clients": 1,
+    "Active Clients": 2,
     "VLAN ID": 20
   },
   {

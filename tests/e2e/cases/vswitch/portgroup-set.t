@@ -12,7 +12,7 @@ Name                Virtual Switch  Active Clients  VLAN ID
 ------------------  --------------  --------------  -------
 Management Network  vSwitch0        1               0
 VM Network          vSwitch0        2               42
-Storage             vSwitch0        1               4095
+Storage             vSwitch0        2               4095
 Migration           vSwitch0        1               0
 Lab Isolated        vSwitch1        0               100
 
@@ -39,7 +39,7 @@ Name                Virtual Switch  Active Clients  VLAN ID
 ------------------  --------------  --------------  -------
 Management Network  vSwitch0        1               0
 VM Network          vSwitch0        2               42
-Storage             vSwitch0        1               4095
+Storage             vSwitch0        2               4095
 Migration           vSwitch0        1               0
 Lab Isolated        vSwitch1        0               100
 

@@ -77,7 +77,7 @@ $ orvixcli network vswitch standard add --vswitch-name="my switch"
 ## the ones the host had.
 $ orvixcli network vswitch standard list --formatter=csv
 Name,Class,Num Ports,Used Ports,Configured Ports,MTU,CDP Status,Beacon Enabled,Beacon Interval,Beacon Threshold,Beacon Required By,Uplinks,Portgroups
-vSwitch0,stdswitch,128,7,8,1500,listen,false,1,3,Migration,"hwnic0,hwnic1","Management Network,VM Network,Storage,Migration"
+vSwitch0,stdswitch,128,8,9,1500,listen,false,1,3,Migration,"hwnic0,hwnic1","Management Network,VM Network,Storage,Migration"
 vSwitch1,stdswitch,64,0,1,9000,down,false,1,3,,,Lab Isolated
 vSwitch2,stdswitch,128,0,0,1500,listen,false,1,3,,,
 vSwitch3,stdswitch,16,0,0,1500,listen,false,1,3,,,

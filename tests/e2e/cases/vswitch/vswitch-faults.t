@@ -82,5 +82,5 @@ ID  OPERATION  KEY  REMAINING  MESSAGE
 
 $ orvixcli network vswitch standard list --formatter=csv
 Name,Class,Num Ports,Used Ports,Configured Ports,MTU,CDP Status,Beacon Enabled,Beacon Interval,Beacon Threshold,Beacon Required By,Uplinks,Portgroups
-vSwitch0,stdswitch,128,7,8,1500,listen,false,1,3,Migration,"hwnic0,hwnic1","Management Network,VM Network,Storage,Migration"
+vSwitch0,stdswitch,128,8,9,1500,listen,false,1,3,Migration,"hwnic0,hwnic1","Management Network,VM Network,Storage,Migration"
 vSwitch1,stdswitch,64,0,1,9000,down,false,1,3,,,Lab Isolated

@@ -5,8 +5,8 @@ vSwitch0
    Name: vSwitch0
    Class: stdswitch
    Num Ports: 128
-   Used Ports: 7
-   Configured Ports: 8
+   Used Ports: 8
+   Configured Ports: 9
    MTU: 1500
    CDP Status: listen
    Beacon Enabled: false

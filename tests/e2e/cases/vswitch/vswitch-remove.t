@@ -10,7 +10,7 @@ $ orvixcli network vswitch standard remove --vswitch-name=dvSwitch0 --formatter=
 
 ## A switch whose ports are in use by anything but its uplinks stays.
 $ orvixcli network vswitch standard remove -v vSwitch0
-! Unable to remove virtual switch vSwitch0: its ports are in use by pld0, pld2, web01.eth0, db01.eth0, db01.eth1
+! Unable to remove virtual switch vSwitch0: its ports are in use by pld0, pld2, web01.eth0, db01.eth0, db01.eth1, app01.eth1
 [1]
 
 ## vSwitch1 has no client: it goes, with its port group. Removed once, it is
