@@ -7,7 +7,7 @@ $ orvixcli --batch ok.txt
 Name,Virtual Switch,Active Clients,VLAN ID
 Management Network,vSwitch0,1,0
 VM Network,vSwitch0,2,0
-Storage,vSwitch0,1,20
+Storage,vSwitch0,2,20
 Migration,vSwitch0,1,30
 Lab Isolated,vSwitch1,0,100
 Batch PG,batchSw,0,0
@@ -23,7 +23,7 @@ $ orvixcli network vswitch standard portgroup list --formatter=csv
 Name,Virtual Switch,Active Clients,VLAN ID
 Management Network,vSwitch0,1,0
 VM Network,vSwitch0,2,0
-Storage,vSwitch0,1,20
+Storage,vSwitch0,2,20
 Migration,vSwitch0,1,30
 Lab Isolated,vSwitch1,0,100
 $ orvixcli --batch stop.txt --force
