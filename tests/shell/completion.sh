@@ -92,10 +92,17 @@ expect_same "unreadable host" "" "$offered"
 
 # Interactive shells: type, press Tab, read the screen.
 # start_shell SHELL ARGS...: each shell has its own tmux server.
+# A shell may drop what is typed before it first prompts, so nothing is typed
+# until its prompt shows (a loaded machine can take seconds to get there).
 start_shell() {
     socket=orvix-completion-$$-$1
     tmux -L "$socket" -f /dev/null new-session -d -x 200 -y 50 \
         env -i HOME="$work" TERM=xterm PATH="$bin:/usr/bin:/bin" ORVIX_HOST_DB="$ORVIX_HOST_DB" "$@"
+    for _ in $(seq 100); do
+        [ -n "$(tmux -L "$socket" capture-pane -p -t 0 | tr -d '[:space:]')" ] && return 0
+        sleep 0.1
+    done
+    fail "$1 did not prompt"
 }
 type_keys() { tmux -L "$socket" send-keys -t 0 "$@"; }
 # screen_shows TEXT: waits up to 10 s for TEXT on the screen (whose lines

@@ -139,3 +139,21 @@ TEST_F(Switches, PolicyEditsFromOlderSnapshotsKeepEachOther) {
 }
 
 }  // namespace
+
+namespace {
+
+TEST_F(Switches, NewPortIdsFitThirtyTwoBitsAndAreFree) {
+    // vSwitch0's highest port takes the very last id: the next id of its
+    // block and a block after every id would both pass 32 bits, so the
+    // uplink port goes to the lowest block no port uses (block 1).
+    Switch("vSwitch0");  // the library makes the host on first use
+    RawSql(
+        "UPDATE object SET key = '4294967295', doc = json_set(doc, '$.id', 4294967295) "
+        "WHERE section = 'ports' AND key = '33554441'");
+    Switch("vSwitch0")->AddUplink("hwnic4");
+    const long long id = Stored("nics", "name", "hwnic4")["uplinkPortId"].get<long long>();
+    EXPECT_EQ(id, (1LL << 24) + 1);
+    EXPECT_EQ(Stored("ports", "id", id)["portset"], "vSwitch0");
+}
+
+}  // namespace

@@ -1,6 +1,8 @@
 #include "network/vswitch/VswitchLookup.h"
 
 #include <algorithm>
+#include <string>
+#include <vector>
 
 #include "hostctl/Lib.h"
 #include "hostctl/network/vswitch/VswitchTables.h"
@@ -83,11 +85,28 @@ void ReleaseNic(Store::Transaction& t, const std::string& nic) {
 }
 
 std::int64_t NextPortId(Store::Transaction& t, const std::vector<PortRecord>& ports) {
-    // Each switch has a block of 2^24 ids.
+    // Each switch has a block of 2^24 ids; port ids are unsigned 32-bit.
     constexpr std::int64_t kPortBlock = std::int64_t(1) << 24;
+    constexpr std::int64_t kLargestId = 0xFFFFFFFF;
+    const auto taken = [&](std::int64_t id) { return t.GetText(PortRecord::kSection, std::to_string(id)).has_value(); };
+    // The next id of the switch's own block, while it is free.
     std::int64_t id = 0;
     for (const PortRecord& port : ports) id = std::max(id, port.id);
-    return id ? id + 1 : (t.MaxIntegerKey(PortRecord::kSection) / kPortBlock + 1) * kPortBlock + 1;
+    if (id > 0 && id < kLargestId && !taken(id + 1)) return id + 1;
+    // Else a block after every id the host has.
+    const std::int64_t fresh = (t.MaxIntegerKey(PortRecord::kSection) / kPortBlock + 1) * kPortBlock + 1;
+    if (fresh <= kLargestId) return fresh;
+    // Else the first block none of whose ids is in use: a host with ids near
+    // the top may still have room lower down.
+    std::vector<bool> used(static_cast<std::size_t>((kLargestId + 1) / kPortBlock), false);
+    for (const std::string& key : t.ListKeys(PortRecord::kSection)) {
+        const std::int64_t block = std::stoll(key) / kPortBlock;
+        if (block >= 0 && block < static_cast<std::int64_t>(used.size())) used[static_cast<std::size_t>(block)] = true;
+    }
+    for (std::size_t block = 1; block < used.size(); ++block) {
+        if (!used[block]) return static_cast<std::int64_t>(block) * kPortBlock + 1;
+    }
+    throw HostCtlException("The host has no free port ids left");
 }
 
 }  // namespace Detail
