@@ -21,12 +21,15 @@ add_custom_command(
   COMMAND ${CMAKE_COMMAND} -E make_directory ${ORVIX_MAN_DIR} ${ORVIX_MAN_GZ_DIR}
           ${CMAKE_BINARY_DIR}/share/bash-completion/completions ${CMAKE_BINARY_DIR}/share/zsh/vendor-completions
   COMMAND $<TARGET_FILE:orvixcli> __manpages ${ORVIX_MAN_DIR} ${ORVIX_MAN_DATE}
+  # orvix-hostsim's page is written by hand; it is checked and installed
+  # with the generated ones.
+  COMMAND ${CMAKE_COMMAND} -E copy ${PROJECT_SOURCE_DIR}/docs/man/orvix-hostsim.8 ${ORVIX_MAN_DIR}/
   COMMAND sh -c "for page in \"$1\"/*.8; do gzip -9n <\"$page\" >\"$2/\${page##*/}.gz\" || exit 1; done"
           sh ${ORVIX_MAN_DIR} ${ORVIX_MAN_GZ_DIR}
   COMMAND sh -c "\"$1\" --completion bash >\"$2\" && \"$1\" --completion zsh >\"$3\""
           sh $<TARGET_FILE:orvixcli> ${ORVIX_BASH_COMPLETION} ${ORVIX_ZSH_COMPLETION}
   COMMAND ${CMAKE_COMMAND} -E touch ${ORVIX_DOCS_STAMP}
-  DEPENDS orvixcli orvix_network_plugin
+  DEPENDS orvixcli orvix_network_plugin ${PROJECT_SOURCE_DIR}/docs/man/orvix-hostsim.8
   COMMENT "Generating the manual pages and completion scripts"
   VERBATIM)
 add_custom_target(orvix_docs ALL DEPENDS ${ORVIX_DOCS_STAMP})
