@@ -6,6 +6,7 @@
 #include <memory>
 #include <sstream>
 #include <streambuf>
+#include <utility>
 
 #include "format/Common.h"
 #include "framework/Format.h"
@@ -35,9 +36,17 @@ bool IsOption(const std::string& token) {
     return !token.empty() && token[0] == '-';
 }
 
-// The options every namespace understands, for suggestions.
-const std::vector<std::string> kGlobalLongOptions = {"formatter", "help", "version"};
-const std::vector<std::string> kGlobalShortOptions = {"h"};
+// The names of the options every namespace understands, long and short, for
+// suggestions: the global options but those taken only before the path.
+std::pair<std::vector<std::string>, std::vector<std::string>> GlobalOptionNames() {
+    std::pair<std::vector<std::string>, std::vector<std::string>> names;
+    for (const GlobalOption& option : GlobalOptions()) {
+        if (option.leadingOnly) continue;
+        names.first.push_back(option.longName);
+        if (!option.shortName.empty()) names.second.push_back(option.shortName);
+    }
+    return names;
+}
 
 std::string FormatterList() {
     return JoinNames(FormatterNames());
@@ -88,7 +97,8 @@ CommandLine Resolve(const boost::shared_ptr<NamespaceNode>& root, const std::vec
             if (line.help) continue;
             std::string message = "Unknown option " + token +
                                   (line.pathWords.empty() ? std::string() : " for '" + JoinPath(line.pathWords) + "'");
-            const std::string suggestion = SuggestOption(token, kGlobalLongOptions, kGlobalShortOptions);
+            const auto [longNames, shortNames] = GlobalOptionNames();
+            const std::string suggestion = SuggestOption(token, longNames, shortNames);
             if (!suggestion.empty()) message += ". Did you mean " + suggestion + "?";
             throw UsageError(message);
         } else {

@@ -11,7 +11,6 @@
 #include <string_view>
 #include <tuple>
 #include <type_traits>
-#include <unordered_map>
 
 #include "network/dvs/DvsRecords.h"
 #include "network/ip/IpLookup.h"
